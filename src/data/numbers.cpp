@@ -1,0 +1,85 @@
+#include "data/numbers.h"
+
+#include <array>
+#include <charconv>
+#include <cmath>
+#include <cstdio>
+#include <system_error>
+
+namespace marlowbeck {
+namespace {
+
+std::string_view WithoutLeadingBlanks(std::string_view text) {
+  const auto first = text.find_first_not_of(" \t");
+  return first == std::string_view::npos ? std::string_view{} : text.substr(first);
+}
+
+struct NumericPrefix {
+  double value = 0;
+  std::size_t length = 0;
+};
+
+/// The longest numeric prefix of a text without leading blanks; length 0 when there is none.
+/// An exponent too large to hold counts as a number with Overflow to follow where it is narrowed.
+NumericPrefix ReadPrefix(std::string_view text) {
+  std::size_t sign = 0;
+  if (!text.empty() && text.front() == '+') sign = 1;
+  const std::string_view digits = text.substr(sign);
+  if (sign == 1 && !digits.empty() && digits.front() == '-') return {};
+  const std::size_t first = (!digits.empty() && digits.front() == '-') ? 1 : 0;
+  // "inf" and "nan" are words here, not numbers.
+  if (digits.size() <= first) return {};
+  const char lead = digits[first];
+  if (lead != '.' && (lead < '0' || lead > '9')) return {};
+  NumericPrefix result;
+  const auto [end, error] =
+      std::from_chars(digits.data(), digits.data() + digits.size(), result.value);
+  if (error == std::errc::invalid_argument) return {};
+  if (error == std::errc::result_out_of_range) result.value = first == 1 ? -HUGE_VAL : HUGE_VAL;
+  result.length = sign + static_cast<std::size_t>(end - digits.data());
+  return result;
+}
+
+}  // namespace
+
+double Val(std::string_view text) { return ReadPrefix(WithoutLeadingBlanks(text)).value; }
+
+double NumberOf(std::string_view text) {
+  const std::string_view body = WithoutLeadingBlanks(text);
+  const NumericPrefix prefix = ReadPrefix(body);
+  const std::string_view rest = WithoutLeadingBlanks(body.substr(prefix.length));
+  if (prefix.length == 0 || !rest.empty()) throw RunTimeError(ErrorNumber::TypeMismatch);
+  return prefix.value;
+}
+
+Integer CInt(std::string_view text) { return Integer::Narrow(NumberOf(text)); }
+
+double Int(double value) { return std::floor(value); }
+
+std::string NumberText(double value) {
+  if (value == 0) return "0";  // also for -0
+  std::array<char, 40> buffer{};
+  std::snprintf(buffer.data(), buffer.size(), "%.15g", value);
+  return buffer.data();
+}
+
+std::string TwoPlaces(double value) {
+  std::array<char, 400> buffer{};
+  std::snprintf(buffer.data(), buffer.size(), "%.2f", value);
+  return buffer.data();
+}
+
+double AverageQuotientFirst(double aggregate, double shots) {
+  return Int(aggregate / shots * 100) / 100;
+}
+
+double AverageHundredfold(double aggregate, double shots) {
+  return Int(100 * (aggregate / shots)) / 100;
+}
+
+double Divide(double a, double b) {
+  if (b == 0) throw RunTimeError(a == 0 ? ErrorNumber::Overflow : ErrorNumber::DivisionByZero);
+  return a / b;
+}
+
+}  // namespace marlowbeck

@@ -1,0 +1,323 @@
+#include "data/real_file_system.h"
+
+#include <fcntl.h>
+#include <sys/stat.h>
+#include <unistd.h>
+
+#ifdef _WIN32
+#include <io.h>
+#include <windows.h>
+#endif
+
+#include <algorithm>
+#include <cerrno>
+#include <system_error>
+#include <utility>
+
+#include "data/runtime_error.h"
+#include "data/text.h"
+
+namespace marlowbeck {
+namespace {
+
+namespace fs = std::filesystem;
+
+fs::path PathOfText(const std::string& text) {
+  const std::string utf8 = Utf8FromCp1252(text);
+  return {std::u8string(utf8.begin(), utf8.end())};
+}
+
+ErrorNumber NumberOfSystemError(int error) {
+  switch (error) {
+    case ENOENT:
+      return ErrorNumber::FileNotFound;
+    case ENOTDIR:
+      return ErrorNumber::PathNotFound;
+    case EACCES:
+    case EPERM:
+    case EROFS:
+    case EBUSY:
+    case ETXTBSY:
+      return ErrorNumber::PermissionDenied;
+    case EEXIST:
+      return ErrorNumber::FileAlreadyExists;
+    case EISDIR:
+    case ENOTEMPTY:
+      return ErrorNumber::PathFileAccess;
+    case ENAMETOOLONG:
+    case EINVAL:
+    case EILSEQ:
+      return ErrorNumber::BadFileName;
+    case EMFILE:
+    case ENFILE:
+      return ErrorNumber::TooManyFiles;
+    case ENOSPC:
+    case EFBIG:
+#ifdef EDQUOT
+    case EDQUOT:
+#endif
+      return ErrorNumber::DiskFull;
+    case EXDEV:
+      return ErrorNumber::RenameAcrossDrives;
+    case ENOMEM:
+      return ErrorNumber::OutOfMemory;
+    case ENXIO:
+    case ENODEV:
+      return ErrorNumber::DeviceUnavailable;
+    default:
+      return ErrorNumber::DeviceIoError;
+  }
+}
+
+/// Throws what the system error says of `path`; a file that is missing because its folder is
+/// counts as a path that was not found.
+[[noreturn]] void Fail(int error, const fs::path& path) {
+  std::error_code ignored;
+  if (error == ENOENT && path.has_parent_path() && !fs::is_directory(path.parent_path(), ignored)) {
+    throw RunTimeError(ErrorNumber::PathNotFound);
+  }
+  throw RunTimeError(NumberOfSystemError(error));
+}
+
+void Check(const std::error_code& error, const fs::path& path) {
+  if (error) Fail(error.default_error_condition().value(), path);
+}
+
+#ifdef _WIN32
+constexpr int kBinary = O_BINARY;
+int OpenDescriptor(const fs::path& path, int flags) { return _wopen(path.c_str(), flags, 0666); }
+int SyncDescriptor(int descriptor) { return _commit(descriptor); }
+void SyncFolderOf(const fs::path&) {}  // a rename reaches the disk with the volume's own journal
+long ReadSome(int descriptor, void* into, std::size_t size, std::uint64_t position) {
+  if (_lseeki64(descriptor, static_cast<long long>(position), SEEK_SET) < 0) return -1;
+  return _read(descriptor, into, static_cast<unsigned>(std::min<std::size_t>(size, 1U << 20)));
+}
+long WriteSome(int descriptor, const void* from, std::size_t size, std::uint64_t position) {
+  if (_lseeki64(descriptor, static_cast<long long>(position), SEEK_SET) < 0) return -1;
+  return _write(descriptor, from, static_cast<unsigned>(std::min<std::size_t>(size, 1U << 20)));
+}
+#else
+constexpr int kBinary = O_CLOEXEC;
+int OpenDescriptor(const fs::path& path, int flags) { return ::open(path.c_str(), flags, 0666); }
+int SyncDescriptor(int descriptor) { return ::fsync(descriptor); }
+void SyncFolderOf(const fs::path& path) {
+  const fs::path folder = path.parent_path();
+  const int descriptor = ::open(folder.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC);
+  if (descriptor < 0) return;  // a folder that may not be opened for reading is left to the system
+  ::fsync(descriptor);
+  ::close(descriptor);
+}
+long ReadSome(int descriptor, void* into, std::size_t size, std::uint64_t position) {
+  return static_cast<long>(::pread(descriptor, into, size, static_cast<off_t>(position)));
+}
+long WriteSome(int descriptor, const void* from, std::size_t size, std::uint64_t position) {
+  return static_cast<long>(::pwrite(descriptor, from, size, static_cast<off_t>(position)));
+}
+#endif
+
+class RealFile : public File {
+ public:
+  RealFile(int descriptor, fs::path path, bool is_new)
+      : descriptor_(descriptor), path_(std::move(path)), is_new_(is_new) {}
+  RealFile(const RealFile&) = delete;
+  RealFile& operator=(const RealFile&) = delete;
+  ~RealFile() override {
+    if (descriptor_ >= 0) ::close(descriptor_);
+  }
+
+  std::uint64_t Length() override {
+    struct stat status {};
+    if (::fstat(descriptor_, &status) != 0) Fail(errno, path_);
+    return static_cast<std::uint64_t>(status.st_size);
+  }
+
+  std::size_t ReadAt(std::uint64_t position, std::span<std::byte> into) override {
+    std::size_t done = 0;
+    while (done < into.size()) {
+      const long count =
+          ReadSome(descriptor_, into.data() + done, into.size() - done, position + done);
+      if (count < 0 && errno == EINTR) continue;
+      if (count < 0) Fail(errno, path_);
+      if (count == 0) break;
+      done += static_cast<std::size_t>(count);
+    }
+    return done;
+  }
+
+  void WriteAt(std::uint64_t position, std::span<const std::byte> from) override {
+    std::size_t done = 0;
+    while (done < from.size()) {
+      const long count =
+          WriteSome(descriptor_, from.data() + done, from.size() - done, position + done);
+      if (count < 0 && errno == EINTR) continue;
+      if (count < 0) Fail(errno, path_);
+      done += static_cast<std::size_t>(count);
+    }
+  }
+
+  void Sync() override {
+    if (SyncDescriptor(descriptor_) != 0) Fail(errno, path_);
+    if (std::exchange(is_new_, false)) SyncFolderOf(path_);
+  }
+
+  void Close() override {
+    const int descriptor = std::exchange(descriptor_, -1);
+    if (descriptor >= 0 && ::close(descriptor) != 0 && errno != EINTR) Fail(errno, path_);
+  }
+
+ private:
+  int descriptor_;
+  fs::path path_;
+  bool is_new_;
+};
+
+/// The entry of `folder` that is `name` in any case; `name` itself when there is none.
+fs::path EntryInAnyCase(const fs::path& folder, const fs::path& name) {
+  std::error_code error;
+  if (fs::exists(folder / name, error)) return folder / name;
+  const std::string wanted = TextOfPath(name);
+  for (const auto& entry : fs::directory_iterator(folder, error)) {
+    if (EqualsIgnoringCase(TextOfPath(entry.path().filename()), wanted)) return entry.path();
+  }
+  return folder / name;
+}
+
+}  // namespace
+
+std::string TextOfPath(const std::filesystem::path& path) {
+  const std::u8string utf8 = path.u8string();
+  return Cp1252FromUtf8(std::string(utf8.begin(), utf8.end()));
+}
+
+std::string FileNameOf(const std::string& path) {
+#ifdef _WIN32
+  const auto separator = path.find_last_of("\\/");
+#else
+  const auto separator = path.find_last_of('/');
+#endif
+  return separator == std::string::npos ? path : path.substr(separator + 1);
+}
+
+RealFileSystem::RealFileSystem() : current_(fs::current_path()) {}
+
+std::filesystem::path RealFileSystem::Located(const std::string& path) const {
+  if (path.empty() || path.find('\0') != std::string::npos) {
+    throw RunTimeError(ErrorNumber::BadFileName);
+  }
+  const fs::path full = (current_ / PathOfText(path)).lexically_normal();
+  std::error_code error;
+  if (fs::exists(full, error)) return full;
+  fs::path located = full.root_path();
+  for (const fs::path& part : full.relative_path()) located = EntryInAnyCase(located, part);
+  return located;
+}
+
+std::unique_ptr<File> RealFileSystem::Open(const std::string& path, OpenMode mode) {
+  const fs::path located = Located(path);
+  std::error_code error;
+  if (fs::is_directory(located, error)) throw RunTimeError(ErrorNumber::PathFileAccess);
+  if (fs::exists(located, error) && !fs::is_regular_file(located, error)) {
+    throw RunTimeError(ErrorNumber::BadFileName);  // a pipe or device would block for ever
+  }
+  if (mode == OpenMode::Read) {
+    const int descriptor = OpenDescriptor(located, O_RDONLY | kBinary);
+    if (descriptor < 0) Fail(errno, located);
+    return std::make_unique<RealFile>(descriptor, located, false);
+  }
+  const bool is_new = !fs::exists(located, error);
+  const int emptying = mode == OpenMode::Truncate ? O_TRUNC : 0;
+  int descriptor = OpenDescriptor(located, O_RDWR | O_CREAT | emptying | kBinary);
+  if (descriptor < 0 && mode == OpenMode::ReadWrite && !is_new &&
+      (errno == EACCES || errno == EROFS)) {
+    // A season on a read-only disk can still be looked at; only a write to it fails.
+    descriptor = OpenDescriptor(located, O_RDONLY | kBinary);
+  }
+  if (descriptor < 0) Fail(errno, located);
+  return std::make_unique<RealFile>(descriptor, located, is_new);
+}
+
+bool RealFileSystem::Exists(const std::string& path) {
+  std::error_code error;
+  return fs::exists(Located(path), error);
+}
+
+void RealFileSystem::Delete(const std::string& path) {
+  const fs::path located = Located(path);
+  std::error_code error;
+  if (fs::is_directory(located, error)) throw RunTimeError(ErrorNumber::PathFileAccess);
+  const bool was_there = fs::remove(located, error);
+  Check(error, located);
+  if (!was_there) Fail(ENOENT, located);
+}
+
+void RealFileSystem::Rename(const std::string& from, const std::string& to) {
+  const fs::path source = Located(from);
+  const fs::path target = Located(to);
+  std::error_code error;
+  if (!fs::exists(source, error)) Fail(ENOENT, source);
+  if (fs::exists(target, error)) throw RunTimeError(ErrorNumber::FileAlreadyExists);
+  fs::rename(source, target, error);
+  Check(error, target);
+  SyncFolderOf(target);
+}
+
+void RealFileSystem::Replace(const std::string& from, const std::string& to) {
+  const fs::path source = Located(from);
+  const fs::path target = Located(to);
+  std::error_code error;
+  if (!fs::exists(source, error)) Fail(ENOENT, source);
+  fs::rename(source, target, error);
+  Check(error, target);
+  SyncFolderOf(target);
+}
+
+void RealFileSystem::Copy(const std::string& from, const std::string& to) {
+  const fs::path source = Located(from);
+  const fs::path target = Located(to);
+  std::error_code error;
+  fs::copy_file(source, target, fs::copy_options::overwrite_existing, error);
+  Check(error, source);
+}
+
+void RealFileSystem::MakeFolder(const std::string& path) {
+  const fs::path located = Located(path);
+  std::error_code error;
+  if (!fs::create_directory(located, error) && !error) {
+    throw RunTimeError(ErrorNumber::PathFileAccess);  // it is there already
+  }
+  Check(error, located);
+}
+
+void RealFileSystem::RemoveFolder(const std::string& path) {
+  const fs::path located = Located(path);
+  std::error_code error;
+  if (!fs::is_directory(located, error)) throw RunTimeError(ErrorNumber::PathNotFound);
+  fs::remove(located, error);
+  Check(error, located);
+}
+
+std::vector<FolderEntry> RealFileSystem::List(const std::string& folder) {
+  const fs::path located = Located(folder);
+  std::error_code error;
+  fs::directory_iterator entries(located, error);
+  Check(error, located);
+  std::vector<FolderEntry> list;
+  for (const auto& entry : entries) {
+    list.push_back({TextOfPath(entry.path().filename()), entry.is_directory(error)});
+  }
+  std::sort(list.begin(), list.end(), [](const FolderEntry& a, const FolderEntry& b) {
+    return std::pair(UpperCase(a.name), a.name) < std::pair(UpperCase(b.name), b.name);
+  });
+  return list;
+}
+
+void RealFileSystem::ChangeFolder(const std::string& folder) {
+  const fs::path located = Located(folder);
+  std::error_code error;
+  if (!fs::is_directory(located, error)) throw RunTimeError(ErrorNumber::PathNotFound);
+  current_ = located;
+}
+
+std::string RealFileSystem::CurrentFolder() { return TextOfPath(current_); }
+
+}  // namespace marlowbeck

@@ -1,0 +1,38 @@
+#pragma once
+
+#include <filesystem>
+
+#include "data/file_system.h"
+
+namespace marlowbeck {
+
+/// The machine's own files. The one place that knows the operating system: system errors become
+/// error numbers here, and names are matched without regard to case on any disk.
+class RealFileSystem : public FileSystem {
+ public:
+  RealFileSystem();
+
+  std::unique_ptr<File> Open(const std::string& path, OpenMode mode) override;
+  bool Exists(const std::string& path) override;
+  void Delete(const std::string& path) override;
+  void Rename(const std::string& from, const std::string& to) override;
+  void Replace(const std::string& from, const std::string& to) override;
+  void Copy(const std::string& from, const std::string& to) override;
+  void MakeFolder(const std::string& path) override;
+  void RemoveFolder(const std::string& path) override;
+  std::vector<FolderEntry> List(const std::string& folder) override;
+  void ChangeFolder(const std::string& folder) override;
+  std::string CurrentFolder() override;
+
+ private:
+  /// The file or folder that a text names: in the current folder when bare, with each part in the
+  /// case in which it lies on the disk when it does.
+  [[nodiscard]] std::filesystem::path Located(const std::string& path) const;
+
+  std::filesystem::path current_;
+};
+
+/// A path of the machine as a text of code page 1252.
+[[nodiscard]] std::string TextOfPath(const std::filesystem::path& path);
+
+}  // namespace marlowbeck

@@ -1,0 +1,49 @@
+#include "data/session.h"
+
+namespace marlowbeck {
+
+std::vector<SessionField> FieldsOf(const Session& session) {
+  const Session& s = session;
+  return {
+      {"PlayerFile", s.PlayerFile},
+      {"ResultsFile", s.ResultsFile},
+      {"LadderFile", s.LadderFile},
+      {"LadderConfigFile", s.LadderConfigFile},
+      {"SeasonFile", s.SeasonFile},
+      {"SeasonReportFile", s.SeasonReportFile},
+      {"SeasonDescription", s.SeasonDescription},
+      {"Grade", s.Grade},
+      {"Team", s.Team},
+      {"PlayerCount", int{s.PlayerCount}},
+      {"ResultCount", int{s.ResultCount}},
+      {"LadderCount", int{s.LadderCount}},
+      {"WorkDate", s.WorkDate},
+      {"BestOfThree", int{s.BestOfThree}},
+      {"BestOfThreeText", s.BestOfThreeText},
+      {"GameNames", std::vector<std::string>(s.GameNames.begin(), s.GameNames.end())},
+      {"EditRecord", int{s.EditRecord}},
+      {"Flag", int{s.Flag}},
+      {"MessageText", s.MessageText},
+      {"MessageAnswer", s.MessageAnswer},
+      {"ErrorNumber", int{s.ErrorNumber}},
+      {"AssociationName", s.AssociationName},
+      {"WinPoints", int{s.WinPoints}},
+      {"LossPoints", int{s.LossPoints}},
+      {"DrawPoints", int{s.DrawPoints}},
+      {"FinalsTeams", int{s.FinalsTeams}},
+      {"GamesPerMatch", int{s.GamesPerMatch}},
+      {"Quiet", s.Quiet},
+      {"ReportChoice", s.ReportChoice},
+      {"Opposition", s.Opposition},
+      {"TeamDates", s.TeamDates},
+      {"DateCount", int{s.DateCount}},
+      {"RowCount", int{s.RowCount}},
+      {"PrintFontSize", int{s.PrintFontSize}},
+      {"PrintFontName", s.PrintFontName},
+      {"PrintFontBold", s.PrintFontBold},
+      {"PrintFontItalic", s.PrintFontItalic},
+      {"PrintBoldBase", s.PrintBoldBase},
+  };
+}
+
+}  // namespace marlowbeck

@@ -1,0 +1,73 @@
+#pragma once
+
+#include <array>
+#include <cstdint>
+#include <string>
+#include <string_view>
+#include <variant>
+#include <vector>
+
+#include "data/date.h"
+#include "data/integer.h"
+#include "data/table.h"
+
+namespace marlowbeck {
+
+/// The one set of shared values, alive from start to exit: beside the files, all that screens tell
+/// each other.
+struct Session {
+  std::string PlayerFile;   ///< full path of the open player file; empty: no file is open
+  std::string ResultsFile;  ///< of the grade in hand, as the five below
+  std::string LadderFile;
+  std::string LadderConfigFile;
+  std::string SeasonFile;
+  std::string SeasonReportFile;
+  std::string SeasonDescription;  ///< last read from or written to SeasonFile
+  std::string Grade;              ///< grade in hand, trimmed
+  std::string Team;               ///< team in hand
+  Integer PlayerCount;            ///< records in the player file when it was last opened
+  Integer ResultCount;
+  Integer LadderCount;
+  Date WorkDate;
+  Integer BestOfThree;  ///< code in hand, as in the player record
+  std::string BestOfThreeText;
+  std::array<std::string, 6> GameNames;  ///< three names and their three short forms
+  Integer EditRecord;                    ///< record being edited; 0 while a new one is made
+  Integer Flag;                          ///< hand-over from one event to the next
+  std::string MessageText;               ///< text for the next box
+  int MessageAnswer = 0;                 ///< answer of the last box
+  Integer ErrorNumber;                   ///< handed to the error box
+  std::string AssociationName;           ///< printed at the head of reports
+  Integer WinPoints;   ///< the ladder configuration of the grade in hand, with the
+  Integer LossPoints;  ///< four below
+  Integer DrawPoints;
+  Integer FinalsTeams;
+  Integer GamesPerMatch;
+
+  bool Quiet = false;  ///< warnings of a guard are held back (score sheets)
+
+  int ReportChoice = 0;         ///< which entry of the Reports menu is open
+  std::string Opposition;       ///< the opposing team of the date in hand (reports)
+  std::vector<Date> TeamDates;  ///< the distinct dates of the team or grade in hand
+  Integer DateCount;            ///< how many they are
+  Integer RowCount;             ///< rows of the table in hand
+
+  std::int32_t PrintFontSize = 10;  ///< whole points
+  std::string PrintFontName = "MS Sans Serif";
+  bool PrintFontBold = false;
+  bool PrintFontItalic = false;
+  bool PrintBoldBase = false;  ///< the printer's bold once it is prepared
+};
+
+using SessionValue =
+    std::variant<std::string, int, bool, Date, std::vector<std::string>, std::vector<Date>>;
+
+struct SessionField {
+  std::string_view name;
+  SessionValue value;
+};
+
+/// Every field by name, in the order of the record.
+[[nodiscard]] std::vector<SessionField> FieldsOf(const Session& session);
+
+}  // namespace marlowbeck

@@ -1,0 +1,98 @@
+#include "data/side_file.h"
+
+#include <algorithm>
+
+#include "data/numbers.h"
+#include "data/runtime_error.h"
+#include "data/text.h"
+
+namespace marlowbeck {
+
+SideFileWriter& SideFileWriter::Text(std::string_view text) {
+  Item('"' + std::string(text) + '"');
+  return *this;
+}
+
+SideFileWriter& SideFileWriter::Number(double number) {
+  Item(NumberText(number));
+  return *this;
+}
+
+SideFileWriter& SideFileWriter::Day(Date date) {
+  Item('#' + IsoDate(date) + '#');
+  return *this;
+}
+
+SideFileWriter& SideFileWriter::Truth(bool truth) {
+  Item(truth ? "#TRUE#" : "#FALSE#");
+  return *this;
+}
+
+SideFileWriter& SideFileWriter::EndLine() {
+  content_ += "\r\n";
+  line_begun_ = false;
+  return *this;
+}
+
+SideFileWriter& SideFileWriter::PlainLine(std::string_view text) {
+  content_ += text;
+  return EndLine();
+}
+
+void SideFileWriter::Item(std::string_view written) {
+  if (line_begun_) content_ += ',';
+  content_ += written;
+  line_begun_ = true;
+}
+
+bool SideFileReader::AtEnd() const { return place_ >= content_.size(); }
+
+std::string SideFileReader::Text() { return Item(); }
+
+double SideFileReader::Number() { return NumberOf(Item()); }
+
+Date SideFileReader::Day() {
+  const std::string item = Item();
+  if (item.size() < 2 || item.front() != '#' || item.back() != '#') {
+    throw RunTimeError(ErrorNumber::TypeMismatch);
+  }
+  const auto date = DateFromIso(std::string_view(item).substr(1, item.size() - 2));
+  if (!date) throw RunTimeError(ErrorNumber::TypeMismatch);
+  return *date;
+}
+
+bool SideFileReader::Truth() {
+  const std::string item = Item();
+  if (item != "#TRUE#" && item != "#FALSE#") throw RunTimeError(ErrorNumber::TypeMismatch);
+  return item == "#TRUE#";
+}
+
+std::string SideFileReader::Item() {
+  if (AtEnd()) throw RunTimeError(ErrorNumber::InputPastEnd);
+  place_ = content_.find_first_not_of(" \t", place_);
+  if (place_ == std::string::npos) {
+    place_ = content_.size();
+    return {};
+  }
+  std::string item;
+  if (content_[place_] == '"') {
+    const auto end = std::min(content_.find('"', place_ + 1), content_.size());
+    item = content_.substr(place_ + 1, end - place_ - 1);
+    place_ = end;
+    place_ = std::min(content_.find_first_of(",\r\n", place_), content_.size());
+  } else {
+    const auto end = std::min(content_.find_first_of(",\r\n", place_), content_.size());
+    item = Trim(std::string_view(content_).substr(place_, end - place_));
+    place_ = end;
+  }
+  PassSeparator();
+  return item;
+}
+
+void SideFileReader::PassSeparator() {
+  if (AtEnd()) return;
+  const bool windows_line_end = content_.compare(place_, 2, "\r\n") == 0;
+  place_ += windows_line_end ? 2 : 1;
+}
+
+}  // namespace marlowbeck

@@ -1,0 +1,53 @@
+#pragma once
+
+#include <string>
+#include <string_view>
+
+#include "data/date.h"
+
+namespace marlowbeck {
+
+/// Builds the text of a side file, a logical record to a line ended by CR LF.
+class SideFileWriter {
+ public:
+  // The quoted form: items of a line separated by commas.
+  SideFileWriter& Text(std::string_view text);  ///< "text"; a quote within is not told apart
+  SideFileWriter& Number(double number);
+  SideFileWriter& Day(Date date);     ///< #2004-03-31#
+  SideFileWriter& Truth(bool truth);  ///< #TRUE# or #FALSE#
+  SideFileWriter& EndLine();
+
+  /// The plain form: one item on a line of its own, no quotes.
+  SideFileWriter& PlainLine(std::string_view text);
+
+  [[nodiscard]] const std::string& Content() const { return content_; }
+
+ private:
+  void Item(std::string_view written);
+
+  std::string content_;
+  bool line_begun_ = false;
+};
+
+/// Reads the items of a side file in either form: an item ends at a comma or a line end unless it
+/// lies in double quotes. Reading on past the last item throws InputPastEnd; an item that does not
+/// hold what is asked for throws TypeMismatch.
+class SideFileReader {
+ public:
+  explicit SideFileReader(std::string content) : content_(std::move(content)) {}
+
+  [[nodiscard]] bool AtEnd() const;
+  [[nodiscard]] std::string Text();
+  [[nodiscard]] double Number();
+  [[nodiscard]] Date Day();
+  [[nodiscard]] bool Truth();
+
+ private:
+  std::string Item();
+  void PassSeparator();
+
+  std::string content_;
+  std::size_t place_ = 0;
+};
+
+}  // namespace marlowbeck

@@ -1,0 +1,137 @@
+#include "data/text.h"
+
+#include <algorithm>
+#include <array>
+#include <cstdint>
+#include <utility>
+
+namespace marlowbeck {
+namespace {
+
+/// Unicode of the bytes 0x80 to 0x9F of code page 1252.
+constexpr std::array<std::uint16_t, 32> kUpperControls = {
+    0x20AC, 0x0081, 0x201A, 0x0192, 0x201E, 0x2026, 0x2020, 0x2021, 0x02C6, 0x2030, 0x0160,
+    0x2039, 0x0152, 0x008D, 0x017D, 0x008F, 0x0090, 0x2018, 0x2019, 0x201C, 0x201D, 0x2022,
+    0x2013, 0x2014, 0x02DC, 0x2122, 0x0161, 0x203A, 0x0153, 0x009D, 0x017E, 0x0178};
+
+constexpr std::uint32_t kNoCharacter = 0xFFFFFFFF;
+
+char UpperByte(char character) {
+  const auto byte = static_cast<unsigned char>(character);
+  if (byte >= 'a' && byte <= 'z') return static_cast<char>(byte - 32);
+  if (byte >= 0xE0 && byte <= 0xFE && byte != 0xF7) return static_cast<char>(byte - 32);
+  switch (byte) {
+    case 0x9A:
+    case 0x9C:
+    case 0x9E:
+      return static_cast<char>(byte - 16);  // s caron, oe, z caron
+    case 0xFF:
+      return static_cast<char>(0x9F);  // y diaeresis
+    default:
+      return character;
+  }
+}
+
+void AppendUtf8(std::string& out, std::uint32_t code) {
+  if (code < 0x80) {
+    out += static_cast<char>(code);
+  } else if (code < 0x800) {
+    out += static_cast<char>(0xC0 | (code >> 6));
+    out += static_cast<char>(0x80 | (code & 0x3F));
+  } else {
+    out += static_cast<char>(0xE0 | (code >> 12));
+    out += static_cast<char>(0x80 | ((code >> 6) & 0x3F));
+    out += static_cast<char>(0x80 | (code & 0x3F));
+  }
+}
+
+/// How many bytes the character that begins with `lead` takes; 0 for a byte that begins none.
+std::size_t Utf8Length(unsigned char lead) {
+  if (lead < 0x80) return 1;
+  if (lead >= 0xC2 && lead <= 0xDF) return 2;
+  if (lead >= 0xE0 && lead <= 0xEF) return 3;
+  if (lead >= 0xF0 && lead <= 0xF4) return 4;
+  return 0;
+}
+
+/// Takes one character off the front of `text`; kNoCharacter, and one byte, where it is garbled.
+std::uint32_t TakeCharacter(std::string_view& text) {
+  const auto lead = static_cast<unsigned char>(text.front());
+  const std::size_t length = Utf8Length(lead);
+  std::uint32_t code = length == 1 ? lead : lead & (0xFFU >> (length + 1));
+  bool whole = length > 0 && length <= text.size();
+  for (std::size_t i = 1; whole && i < length; ++i) {
+    const auto byte = static_cast<unsigned char>(text[i]);
+    whole = (byte & 0xC0) == 0x80;
+    code = (code << 6) | (byte & 0x3FU);
+  }
+  text.remove_prefix(whole ? length : 1);
+  return whole ? code : kNoCharacter;
+}
+
+char ByteOf(std::uint32_t code) {
+  if (code < 0x80 || (code >= 0xA0 && code <= 0xFF)) return static_cast<char>(code);
+  const auto* const place = std::find(kUpperControls.begin(), kUpperControls.end(), code);
+  return place == kUpperControls.end() ? '?'
+                                       : static_cast<char>(0x80 + (place - kUpperControls.begin()));
+}
+
+}  // namespace
+
+std::string_view Trimmed(std::string_view text) {
+  const auto first = text.find_first_not_of(' ');
+  if (first == std::string_view::npos) return {};
+  return text.substr(first, text.find_last_not_of(' ') - first + 1);
+}
+
+std::string Trim(std::string_view text) { return std::string(Trimmed(text)); }
+
+std::string UpperCase(std::string_view text) {
+  std::string result(text);
+  std::transform(result.begin(), result.end(), result.begin(), UpperByte);
+  return result;
+}
+
+bool EqualsIgnoringCase(std::string_view a, std::string_view b) {
+  return std::equal(a.begin(), a.end(), b.begin(), b.end(),
+                    [](char x, char y) { return UpperByte(x) == UpperByte(y); });
+}
+
+std::string FixedWidth(std::string_view text, std::size_t width) {
+  std::string result(text.substr(0, width));
+  result.resize(width, ' ');
+  return result;
+}
+
+std::string WithoutLast(std::string_view text, std::size_t count) {
+  return std::string(text.substr(0, text.size() > count ? text.size() - count : 0));
+}
+
+std::string Lines(std::initializer_list<std::string_view> lines) {
+  std::string result;
+  bool first = true;
+  for (const std::string_view line : lines) {
+    if (!std::exchange(first, false)) result += '\r';
+    result += line;
+  }
+  return result;
+}
+
+std::string Utf8FromCp1252(std::string_view text) {
+  std::string result;
+  result.reserve(text.size());
+  for (const char character : text) {
+    const auto byte = static_cast<unsigned char>(character);
+    AppendUtf8(result, byte >= 0x80 && byte <= 0x9F ? kUpperControls[byte - 0x80U] : byte);
+  }
+  return result;
+}
+
+std::string Cp1252FromUtf8(std::string_view text) {
+  std::string result;
+  result.reserve(text.size());
+  while (!text.empty()) result += ByteOf(TakeCharacter(text));
+  return result;
+}
+
+}  // namespace marlowbeck

@@ -1,0 +1,36 @@
+#pragma once
+
+#include <string>
+#include <string_view>
+
+#include "session/messages.h"
+#include "ui/context.h"
+#include "ui/controls.h"
+
+namespace marlowbeck {
+
+class Screens;
+
+/// Refills a list with the distinct grades of the open competition, ascending. Opens and closes the
+/// player file; nothing is listed while no file is open.
+void GetGrades(const Context& context, LineHolder& list);
+
+/// Refills a list with the distinct teams of a grade, ascending.
+void GetTeams(const Context& context, std::string_view grade, LineHolder& list);
+
+/// Reads the six strings of `GameName.qz3` into the session. A file that cannot be read is written
+/// anew with the names that every installation begins with.
+void GameNames(const Context& context);
+
+/// Reads the open competition's path from `FileName.qz3` in the working folder into PlayerFile.
+/// Throws when it cannot be read.
+void ReadFileName(const Context& context);
+void WriteFileName(const Context& context);
+
+/// The words for a Best of Three code, with the game names of the session: BestOfThreeText.
+[[nodiscard]] std::string PegsDescription(const Session& session, int code);
+
+/// Tells that no competition is open, on the main menu and in a box.
+void nofile(const Context& context, Screens& screens, Beep beep);
+
+}  // namespace marlowbeck

@@ -1,0 +1,343 @@
+#include "ui/hand.h"
+
+#include <algorithm>
+#include <utility>
+
+#include "data/text.h"
+
+namespace marlowbeck {
+namespace {
+
+Outcome Refused(const Control& control, std::string_view why) {
+  return {control.Name() + " " + std::string(why), false};
+}
+
+/// Why nobody could act on a control now; empty when somebody could.
+Outcome CheckLive(const Control& control) {
+  if (!control.Shown()) return Refused(control, "is hidden");
+  if (!control.EnabledThroughout()) return Refused(control, "is disabled");
+  return {};
+}
+
+template <typename T>
+T* As(Control& control) {
+  return dynamic_cast<T*>(&control);
+}
+
+bool CanBeClicked(const Control& control) {
+  switch (control.GetKind()) {
+    case Kind::Panel:
+    case Kind::Label:
+    case Kind::Progress:
+      return static_cast<bool>(control.Click);
+    default:
+      return true;
+  }
+}
+
+bool CanBeTypedInto(Control& control) {
+  if (const auto* box = As<TextBox>(control)) return !box->Locked();
+  if (const auto* combo = As<ComboBox>(control)) return !combo->Locked();
+  return false;
+}
+
+const std::string& TextOf(Control& control) {
+  if (const auto* combo = As<ComboBox>(control)) return combo->Text();
+  return static_cast<TextBox&>(control).Text();
+}
+
+void AssignText(Control& control, std::string_view text) {
+  if (auto* combo = As<ComboBox>(control)) {
+    combo->SetText(text);
+  } else {
+    static_cast<TextBox&>(control).SetText(text);
+  }
+}
+
+}  // namespace
+
+Outcome Hand::Whole(const Handler& action) {
+  screens_.GetDispatcher().Run(action);
+  screens_.Settle();
+  return {};
+}
+
+/// Moves the focus to the control when it takes one and acts if the control is still there to be
+/// acted on; otherwise the action is lost.
+Outcome Hand::Act(Control& control, const Handler& action) {
+  bool lost = true;
+  Whole([&] {
+    screens_.BringToFront(control.InScreen());
+    lost = !TakeFocus(control);
+    if (!lost) action();
+  });
+  return {{}, lost};
+}
+
+bool Hand::TakeFocus(Control& control) {
+  if (!control.TakesFocus()) return true;
+  const long boxes_before = boxes_.Shown();
+  control.SetFocus();
+  return boxes_.Shown() == boxes_before && control.InScreen().Focus() == &control;
+}
+
+Outcome Hand::Click(Control& control) {
+  if (const Outcome check = CheckLive(control); !check.Done()) return check;
+  if (!CanBeClicked(control)) return Refused(control, "has no click");
+  return Act(control, [&] { ClickWithFocus(control); });
+}
+
+void Hand::ClickWithFocus(Control& control) {
+  if (auto* check = As<CheckBox>(control)) {
+    check->SetValue(!check->Value());
+  } else if (auto* option = As<OptionButton>(control)) {
+    if (option->Value()) return;
+    option->SetValue(true);
+  } else if (As<LineHolder>(control) != nullptr) {
+    return;  // beside the lines
+  }
+  control.Fire(control.Click);
+}
+
+Outcome Hand::DoubleClick(Control& control) {
+  const Outcome outcome = Click(control);
+  if (!outcome.Done() || outcome.lost || !control.DoubleClick || !control.Live()) return outcome;
+  Whole([&] { control.Fire(control.DoubleClick); });
+  return outcome;
+}
+
+Outcome Hand::Type(Control& control, std::string_view text) {
+  if (const Outcome check = CheckLive(control); !check.Done()) return check;
+  if (!CanBeTypedInto(control)) return Refused(control, "cannot be typed into");
+  return Act(control, [&] {
+    // What is typed first replaces the text that was marked; all else stands behind what the box
+    // then holds, as it does for a person.
+    AssignText(control, text.substr(0, 1));
+    for (std::size_t i = 1; i < text.size() && control.Live(); ++i) {
+      AssignText(control, TextOf(control) + text[i]);
+    }
+  });
+}
+
+Outcome Hand::Retype(Control& control, std::string_view text) {
+  if (const Outcome check = CheckLive(control); !check.Done()) return check;
+  if (!CanBeTypedInto(control)) return Refused(control, "cannot be typed into");
+  return Act(control, [&] { AssignText(control, text); });
+}
+
+Outcome Hand::Pick(Control& control, int line) {
+  if (const Outcome check = CheckLive(control); !check.Done()) return check;
+  auto* const list = As<LineHolder>(control);
+  if (list == nullptr) return Refused(control, "has no lines");
+  if (line < 0 || line >= list->Count()) return Refused(control, "has no such line");
+  return Act(control, [=] {
+    if (line >= list->Count()) return;
+    if (auto* marks = As<ListBox>(*list); marks != nullptr && marks->Multi()) {
+      marks->ClearMarks();
+      marks->SetMarked(line, true);
+    }
+    list->SetIndex(line);
+  });
+}
+
+Outcome Hand::PickTwice(Control& control, int line) {
+  const Outcome outcome = Pick(control, line);
+  if (!outcome.Done() || outcome.lost || !control.DoubleClick || !control.Live()) return outcome;
+  Whole([&] { control.Fire(control.DoubleClick); });
+  return outcome;
+}
+
+Outcome Hand::Select(Control& control, const std::vector<int>& lines) {
+  if (const Outcome check = CheckLive(control); !check.Done()) return check;
+  auto* const list = As<ListBox>(control);
+  if (list == nullptr || !list->Multi()) return Refused(control, "marks one line only");
+  for (const int line : lines) {
+    if (line < 0 || line >= list->Count()) return Refused(control, "has no such line");
+  }
+  return Act(control, [&] {
+    if (lines.empty()) {
+      const std::set<int> marked = list->Marked();
+      for (const int line : marked) {
+        list->SetMarked(line, false);
+        list->SetIndex(line);
+      }
+      return;
+    }
+    list->ClearMarks();
+    for (const int line : lines) {
+      list->SetMarked(line, true);
+      list->SetIndex(line);
+    }
+  });
+}
+
+Outcome Hand::ClickCell(Control& control, int row, int col) {
+  if (const Outcome check = CheckLive(control); !check.Done()) return check;
+  auto* const grid = As<Grid>(control);
+  if (grid == nullptr) return Refused(control, "has no cells");
+  if (row < 0 || row >= grid->Rows() || col < 0 || col >= grid->Cols()) {
+    return Refused(control, "has no such cell");
+  }
+  return Act(control, [=] {
+    grid->SetCurrent(row, col);
+    grid->Fire(grid->Click);
+  });
+}
+
+Outcome Hand::DoubleClickCell(Control& control, int row, int col) {
+  const Outcome outcome = ClickCell(control, row, col);
+  if (!outcome.Done() || outcome.lost || !control.DoubleClick || !control.Live()) return outcome;
+  Whole([&] { control.Fire(control.DoubleClick); });
+  return outcome;
+}
+
+Outcome Hand::PickDate(Control& control, Date date) {
+  if (const Outcome check = CheckLive(control); !check.Done()) return check;
+  auto* const picker = As<DatePicker>(control);
+  if (picker == nullptr) return Refused(control, "has no date");
+  return Act(control, [=] {
+    if (picker->Value() == date) return;
+    picker->SetValue(date);
+    picker->Fire(picker->Change);
+  });
+}
+
+Outcome Hand::Focus(Control& control) {
+  if (const Outcome check = CheckLive(control); !check.Done()) return check;
+  if (!control.TakesFocus()) return Refused(control, "takes no focus");
+  return Act(control, [] {});
+}
+
+Outcome Hand::Hover(Control& control) {
+  if (!control.Shown()) return Refused(control, "is hidden");
+  if (!control.MouseMove) return {};
+  return Whole([&] { control.Fire(control.MouseMove); });
+}
+
+Outcome Hand::HoverScreen(Screen& screen) {
+  if (!screen.Visible()) return {screen.Name() + " is hidden", false};
+  return Whole([&] { screen.MouseMove(); });
+}
+
+Outcome Hand::CloseScreen(Screen& screen) {
+  if (!screen.Visible()) return {screen.Name() + " is hidden", false};
+  if (!screen.Enabled()) return {screen.Name() + " is disabled", false};
+  return Whole([&] { screen.CloseButton(); });
+}
+
+Outcome Hand::Press(Key key) {
+  Screen* const front = screens_.Front();
+  if (front == nullptr) return {"no screen is in front", false};
+  if (!front->Enabled()) return {front->Name() + " is disabled", false};
+  open_menu_ = nullptr;
+  return Whole([&] { PressOn(front->Focus(), *front, key); });
+}
+
+void Hand::PressOn(Control* focus, Screen& front, Key key) {
+  switch (key) {
+    case Key::Enter:
+      return PressEnter(focus, front);
+    case Key::Tab:
+    case Key::BackTab:
+      if (Control* const next = front.NextStop(key == Key::BackTab)) next->SetFocus();
+      return;
+    case Key::Escape:
+      return front.Escape();
+    case Key::F1:
+      return front.HelpKey();
+    case Key::Up:
+    case Key::Down:
+      if (focus == nullptr) return;
+      if (auto* list = As<LineHolder>(*focus)) return MoveLine(*list, key == Key::Up ? -1 : 1);
+      return MoveAmong(*focus, key == Key::Up);
+  }
+}
+
+void Hand::PressEnter(Control* focus, Screen& front) {
+  if (focus != nullptr) {
+    switch (focus->GetKind()) {
+      case Kind::Command:
+      case Kind::Picture:
+        return focus->Fire(focus->Click);
+      case Kind::Text:
+      case Kind::Combo:
+        // Enter in an entry box is a Tab.
+        if (Control* const next = front.NextStop(false)) next->SetFocus();
+        return;
+      case Kind::List:
+        if (auto& list = static_cast<ListBox&>(*focus); list.PicksOnEnter()) {
+          if (list.Cursor() >= 0) list.SetIndex(list.Cursor());
+          return;
+        }
+        break;
+      default:
+        break;
+    }
+  }
+  ClickFirstLive(front.Defaults);
+}
+
+void Hand::MoveLine(LineHolder& list, int step) {
+  if (auto* box = As<ListBox>(list); box != nullptr && box->PicksOnEnter()) {
+    box->SetCursor(std::clamp(box->Cursor() + step, 0, std::max(box->Count() - 1, 0)));
+    return;
+  }
+  const int line = std::clamp(list.Index() + step, 0, list.Count() - 1);
+  if (list.Count() > 0 && line != list.Index()) {
+    list.SetIndex(line);
+    list.Fire(list.KeyUp);
+  }
+}
+
+/// The arrow keys go from picture to picture, and from option to option, which selects it.
+void Hand::MoveAmong(Control& focus, bool backward) {
+  if (focus.GetKind() != Kind::Picture && focus.GetKind() != Kind::Option) return;
+  std::vector<Control*> peers;
+  for (Control* control : focus.InScreen().Controls()) {
+    if (control->GetKind() == focus.GetKind() && control->InControl() == focus.InControl() &&
+        control->Live()) {
+      peers.push_back(control);
+    }
+  }
+  const auto present = std::find(peers.begin(), peers.end(), &focus) - peers.begin();
+  const auto next = present + (backward ? -1 : 1);
+  if (next < 0 || next >= static_cast<std::ptrdiff_t>(peers.size())) return;
+  Control& target = *peers[static_cast<std::size_t>(next)];
+  target.SetFocus();
+  if (target.GetKind() == Kind::Option) ClickWithFocus(target);
+}
+
+Outcome Hand::PressMnemonic(char letter) {
+  Screen* const front = screens_.Front();
+  if (front == nullptr) return {"no screen is in front", false};
+  Control* const control = WithMnemonic(*front, UpperCase(std::string(1, letter)).front());
+  if (control == nullptr) {
+    return {front->Name() + " has no live mnemonic " + std::string(1, letter), false};
+  }
+  const bool is_menu =
+      control->GetKind() == Kind::Menu &&
+      std::any_of(front->Controls().begin(), front->Controls().end(),
+                  [&](const Control* entry) { return entry->InControl() == control; });
+  open_menu_ = is_menu ? control : nullptr;
+  return is_menu ? Outcome{} : Click(*control);
+}
+
+Control* Hand::WithMnemonic(const Screen& front, char letter) const {
+  for (const Control* menu : {open_menu_, static_cast<const Control*>(nullptr)}) {
+    for (Control* control : front.Controls()) {
+      const bool in_reach =
+          control->GetKind() == Kind::Menu ? control->InControl() == menu : menu == nullptr;
+      if (in_reach && control->Live() && MnemonicOf(control->Caption()) == letter) return control;
+    }
+  }
+  return nullptr;
+}
+
+char MnemonicOf(std::string_view caption) {
+  const auto mark = caption.find('&');
+  if (mark == std::string_view::npos || mark + 1 >= caption.size()) return 0;
+  const char letter = UpperCase(caption.substr(mark + 1, 1)).front();
+  return letter == '&' || letter == ' ' ? '\0' : letter;
+}
+
+}  // namespace marlowbeck

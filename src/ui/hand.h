@@ -1,0 +1,70 @@
+#pragma once
+
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include "platform/platform.h"
+#include "ui/controls.h"
+#include "ui/screens.h"
+
+namespace marlowbeck {
+
+enum class Key { Enter, Tab, BackTab, Escape, Up, Down, F1 };
+
+/// How a person's action went.
+struct Outcome {
+  std::string refusal;  ///< why it could not be carried out; nothing has changed then
+  bool lost = false;    ///< leaving the control before showed a box or took the focus elsewhere
+
+  [[nodiscard]] bool Done() const { return refusal.empty(); }
+};
+
+/// What a person can do with mouse and keyboard, told in the terms of controls. Every face works
+/// the screens through it and through nothing else. Each procedure is one event: it moves the focus
+/// first, which runs the leaving checks of the control left, then acts.
+class Hand {
+ public:
+  Hand(Screens& screens, Boxes& boxes) : screens_(screens), boxes_(boxes) {}
+
+  Outcome Click(Control& control);
+  Outcome DoubleClick(Control& control);
+  /// Replaces the whole text of an entry box or free combo, character by character, as typed.
+  Outcome Type(Control& control, std::string_view text);
+  /// The text of an entry box or free combo has become another one by a keystroke.
+  Outcome Retype(Control& control, std::string_view text);
+  Outcome Pick(Control& control, int line);
+  Outcome PickTwice(Control& control, int line);
+  /// Marks just these lines of a list, by click and control-click.
+  Outcome Select(Control& control, const std::vector<int>& lines);
+  Outcome ClickCell(Control& control, int row, int col);
+  Outcome DoubleClickCell(Control& control, int row, int col);
+  Outcome PickDate(Control& control, Date date);
+  Outcome Press(Key key);
+  /// The mnemonic of a letter: the command with it, or a menu, and then an entry of that menu.
+  Outcome PressMnemonic(char letter);
+  Outcome Focus(Control& control);
+  Outcome Hover(Control& control);
+  Outcome HoverScreen(Screen& screen);
+  Outcome CloseScreen(Screen& screen);
+
+ private:
+  Outcome Act(Control& control, const Handler& action);
+  Outcome Whole(const Handler& action);
+  bool TakeFocus(Control& control);
+  void ClickWithFocus(Control& control);
+  void PressOn(Control* focus, Screen& front, Key key);
+  void PressEnter(Control* focus, Screen& front);
+  void MoveLine(LineHolder& list, int step);
+  void MoveAmong(Control& focus, bool backward);
+  [[nodiscard]] Control* WithMnemonic(const Screen& front, char letter) const;
+
+  Screens& screens_;
+  Boxes& boxes_;
+  const Control* open_menu_ = nullptr;
+};
+
+/// The letter after a single "&" in a caption, upper-cased; 0 for none.
+[[nodiscard]] char MnemonicOf(std::string_view caption);
+
+}  // namespace marlowbeck

@@ -32,6 +32,7 @@ std::vector<SessionField> FieldsOf(const Session& session) {
       {"DrawPoints", int{s.DrawPoints}},
       {"FinalsTeams", int{s.FinalsTeams}},
       {"GamesPerMatch", int{s.GamesPerMatch}},
+      {"SearchText", s.SearchText},
       {"Quiet", s.Quiet},
       {"ReportChoice", s.ReportChoice},
       {"Opposition", s.Opposition},

@@ -44,6 +44,8 @@ struct Session {
   Integer FinalsTeams;
   Integer GamesPerMatch;
 
+  std::string SearchText;  ///< upper-cased part of a surname to look for
+
   bool Quiet = false;  ///< warnings of a guard are held back (score sheets)
 
   int ReportChoice = 0;         ///< which entry of the Reports menu is open

@@ -2,7 +2,11 @@
 
 #include <memory>
 
+#include "session/frmAbout.h"
+#include "session/frmBuend.h"
+#include "session/frmDB.h"
 #include "session/frmErrors.h"
+#include "session/frmSort.h"
 
 namespace marlowbeck {
 namespace {
@@ -15,6 +19,10 @@ void Register(Screens& screens, const char* name, const Context& context) {
 }  // namespace
 
 void RegisterScreens(Screens& screens, const Context& context) {
+  Register<frmDB>(screens, "frmDB", context);
+  Register<frmBuend>(screens, "frmBuend", context);
+  Register<frmSort>(screens, "frmSort", context);
+  Register<frmAbout>(screens, "frmAbout", context);
   Register<frmErrors>(screens, "frmErrors", context);
 }
 

@@ -111,4 +111,10 @@ void nofile(const Context& context, Screens& screens, Beep beep) {
           beep);
 }
 
+void EndProgram(const Context& context, Screens& screens) {
+  context.channels.CloseAll();
+  screens.End();
+  context.platform.observer.Ended();
+}
+
 }  // namespace marlowbeck

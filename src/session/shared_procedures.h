@@ -33,4 +33,7 @@ void WriteFileName(const Context& context);
 /// Tells that no competition is open, on the main menu and in a box.
 void nofile(const Context& context, Screens& screens, Beep beep);
 
+/// The end of the program: what runs now is the last thing that it does.
+void EndProgram(const Context& context, Screens& screens);
+
 }  // namespace marlowbeck

@@ -1,0 +1,134 @@
+// The main menu's ways to the other screens.
+
+#include "data/competition.h"
+#include "data/numbers.h"
+#include "data/text.h"
+#include "session/association.h"
+#include "session/frmDB.h"
+#include "session/shared_procedures.h"
+#include "ui/screens.h"
+
+namespace marlowbeck {
+namespace {
+
+constexpr int kFewestTeams = 3;
+constexpr int kMostTeams = 50;
+
+}  // namespace
+
+void frmDB::AddPlayers() {
+  Menus();
+  if (!InScreens().Knows("frmNames")) return;
+  WriteFileName(context_);
+  session_.Flag = 0;
+  InScreens().Hide(*this);
+  InScreens().Show("frmNames");
+}
+
+/// Opens a screen that reads the open competition's name for itself.
+void frmDB::Open(std::string_view screen) {
+  Menus();
+  if (!InScreens().Knows(screen)) return;
+  WriteFileName(context_);
+  InScreens().Hide(*this);
+  InScreens().Show(screen);
+}
+
+void frmDB::OpenWithFile(std::string_view screen) {
+  if (!session_.PlayerFile.empty()) Open(screen);
+}
+
+// KEPT: the test looks at the grade of the first player alone, for the knock-out too, whose words
+// speak of players; a repair would look at every grade, and count players for the knock-out.
+bool frmDB::FirstGradeHasTwoTeams() {
+  OpenPlayerFile();
+  std::string grade;
+  std::string team;
+  bool found = false;
+  context_.channels.ForEachRecord(Channel::Players, [&](Bytes bytes, int number) {
+    const PlayerView player(bytes);
+    if (number == 1) {
+      grade = player.Grade();
+      team = player.Team();
+    }
+    found = player.Grade() == grade && player.Team() != team;
+    return !found;
+  });
+  context_.channels.CloseAll();
+  return found;
+}
+
+void frmDB::OpenAfterTeamsTest(std::string_view screen, std::string_view refusal) {
+  Menus();
+  if (session_.PlayerFile.empty()) return;
+  if (FirstGradeHasTwoTeams()) {
+    Open(screen);
+  } else {
+    Warning(context_, refusal, Beep::First);
+  }
+}
+
+void frmDB::imgSheets_Click() {
+  OpenAfterTeamsTest("frmResults", Lines({"You must have at least 2 Teams in each grade    ",
+                                          "before you can enter player's scores.    "}));
+}
+
+void frmDB::imgLadder_Click() {
+  OpenAfterTeamsTest("frmLadder", Lines({"You must have at least 2 Teams in your file    ",
+                                         "before using the Ladder.    "}));
+}
+
+void frmDB::imgKO_Click() {
+  OpenAfterTeamsTest("frmKnockOut", "You must have at least 2 Players for a Knock-Out.    ");
+}
+
+void frmDB::imgPrinter_Click() { OpenWithFile("frmPMenu"); }
+
+void frmDB::imgbackup_Click() {
+  Menus();
+  context_.channels.CloseAll();
+  Screen* const backup = InScreens().Load("frmBackup");
+  if (backup == nullptr) return;
+  backup->Find("cmdCancel")->SetCaption("Main Menu");
+  SetEnabled(false);
+  InScreens().Show("frmBackup");
+}
+
+void frmDB::mnuFix_Click() {
+  for (;;) {
+    const std::string reply = context_.platform.boxes.Input(
+        {Lines({"Accepted range for this fixture", "generator is from 3 to 50.", "", "",
+                "How many teams in the fixture ?"}),
+         "(Marlowbeck) Fixture Generator",
+         {},
+         {}});
+    const Integer teams = Integer::Narrow(Val(reply));
+    if (teams < 1) return;
+    if (teams >= kFewestTeams && teams <= kMostTeams) {
+      InScreens().Show("frmFixtures");
+      return;
+    }
+    Warning(context_, Lines({"Accepted range is from 3 to 50,    ", "Please try again.    "}),
+            Beep::First);
+  }
+}
+
+void frmDB::mnuSearchPlayer_Click() {
+  const std::string reply =
+      context_.platform.boxes.Input({"Enter SURNAME to Search for.", "Name Search", {}, {}});
+  if (Trimmed(reply).empty() || !InScreens().Knows("frmSearchPlayer")) return;
+  session_.SearchText = UpperCase(Trimmed(reply));
+  session_.Flag = 1;
+  InScreens().Hide(*this);
+  InScreens().Show("frmSearchPlayer");
+}
+
+void frmDB::mnuAssociation_Click() { AskAssociationName(context_); }
+
+void frmDB::Leave() {
+  context_.GoToWorkingFolder();
+  InScreens().Hide(*this);
+  InScreens().Show("frmBuend");
+}
+
+}  // namespace marlowbeck

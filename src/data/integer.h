@@ -1,6 +1,5 @@
 #pragma once
 
-#include <compare>
 #include <cstdint>
 
 #include "data/runtime_error.h"
@@ -22,12 +21,13 @@ class Integer {
 
   constexpr operator int() const { return value_; }  // NOLINT(google-explicit-constructor)
 
-  Integer& operator+=(int other) { return *this = Integer(value_ + other); }
-  Integer& operator-=(int other) { return *this = Integer(value_ - other); }
+  Integer& operator+=(int other) { return *this = Integer(Sum(value_, other)); }
+  Integer& operator-=(int other) { return *this = Integer(Sum(value_, -std::int64_t{other})); }
   Integer& operator++() { return *this += 1; }
 
  private:
-  static constexpr std::int16_t Checked(int value) {
+  static constexpr int Sum(std::int64_t a, std::int64_t b) { return Checked(a + b); }
+  static constexpr std::int16_t Checked(std::int64_t value) {
     if (value < INT16_MIN || value > INT16_MAX) throw RunTimeError(ErrorNumber::Overflow);
     return static_cast<std::int16_t>(value);
   }

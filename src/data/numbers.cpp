@@ -3,7 +3,6 @@
 #include <array>
 #include <charconv>
 #include <cmath>
-#include <cstdio>
 #include <system_error>
 
 namespace marlowbeck {
@@ -18,6 +17,12 @@ struct NumericPrefix {
   double value = 0;
   std::size_t length = 0;
 };
+
+/// Of a number that no double can hold: it is too close to 0, not too large.
+bool IsTiny(std::string_view number) {
+  return number.find("e-") != number.npos || number.find("E-") != number.npos ||
+         number.front() == '.' || number.front() == '0';
+}
 
 /// The longest numeric prefix of a text without leading blanks; length 0 when there is none.
 /// An exponent too large to hold counts as a number with Overflow to follow where it is narrowed.
@@ -35,9 +40,20 @@ NumericPrefix ReadPrefix(std::string_view text) {
   const auto [end, error] =
       std::from_chars(digits.data(), digits.data() + digits.size(), result.value);
   if (error == std::errc::invalid_argument) return {};
-  if (error == std::errc::result_out_of_range) result.value = first == 1 ? -HUGE_VAL : HUGE_VAL;
-  result.length = sign + static_cast<std::size_t>(end - digits.data());
+  const auto length = static_cast<std::size_t>(end - digits.data());
+  if (error == std::errc::result_out_of_range && !IsTiny(digits.substr(first, length - first))) {
+    result.value = first == 1 ? -HUGE_VAL : HUGE_VAL;
+  }
+  result.length = sign + length;
   return result;
+}
+
+/// With a point for the decimals whatever the machine's own habit, which printf would follow.
+std::string Written(double value, std::chars_format format, int precision) {
+  std::array<char, 400> buffer{};
+  const auto [end, error] =
+      std::to_chars(buffer.data(), buffer.data() + buffer.size(), value, format, precision);
+  return {buffer.data(), end};
 }
 
 }  // namespace
@@ -58,16 +74,10 @@ double Int(double value) { return std::floor(value); }
 
 std::string NumberText(double value) {
   if (value == 0) return "0";  // also for -0
-  std::array<char, 40> buffer{};
-  std::snprintf(buffer.data(), buffer.size(), "%.15g", value);
-  return buffer.data();
+  return Written(value, std::chars_format::general, 15);
 }
 
-std::string TwoPlaces(double value) {
-  std::array<char, 400> buffer{};
-  std::snprintf(buffer.data(), buffer.size(), "%.2f", value);
-  return buffer.data();
-}
+std::string TwoPlaces(double value) { return Written(value, std::chars_format::fixed, 2); }
 
 double AverageQuotientFirst(double aggregate, double shots) {
   return Int(aggregate / shots * 100) / 100;

@@ -76,7 +76,7 @@ std::string SideFileReader::Item() {
   }
   std::string item;
   if (content_[place_] == '"') {
-    const auto end = std::min(content_.find('"', place_ + 1), content_.size());
+    const auto end = ClosingQuote();
     item = content_.substr(place_ + 1, end - place_ - 1);
     place_ = end;
     place_ = std::min(content_.find_first_of(",\r\n", place_), content_.size());
@@ -87,6 +87,18 @@ std::string SideFileReader::Item() {
   }
   PassSeparator();
   return item;
+}
+
+/// Where the quoted text ends that begins at the present place: at the first quote of its line with
+/// nothing but blanks between it and the item's end, or else at the first quote there is.
+std::size_t SideFileReader::ClosingQuote() const {
+  const auto line_end = content_.find_first_of("\r\n", place_);
+  const auto first = content_.find('"', place_ + 1);
+  for (auto quote = first; quote < line_end; quote = content_.find('"', quote + 1)) {
+    const auto next = content_.find_first_not_of(" \t", quote + 1);
+    if (next == std::string::npos || next == line_end || content_[next] == ',') return quote;
+  }
+  return std::min(first, content_.size());
 }
 
 void SideFileReader::PassSeparator() {

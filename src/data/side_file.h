@@ -11,7 +11,7 @@ namespace marlowbeck {
 class SideFileWriter {
  public:
   // The quoted form: items of a line separated by commas.
-  SideFileWriter& Text(std::string_view text);  ///< "text"; a quote within is not told apart
+  SideFileWriter& Text(std::string_view text);  ///< "text", quotes within as they are
   SideFileWriter& Number(double number);
   SideFileWriter& Day(Date date);     ///< #2004-03-31#
   SideFileWriter& Truth(bool truth);  ///< #TRUE# or #FALSE#
@@ -30,7 +30,8 @@ class SideFileWriter {
 };
 
 /// Reads the items of a side file in either form: an item ends at a comma or a line end unless it
-/// lies in double quotes. Reading on past the last item throws InputPastEnd; an item that does not
+/// lies in double quotes. A quote within a text is part of it unless an item could end there.
+/// Reading on past the last item throws InputPastEnd; an item that does not
 /// hold what is asked for throws TypeMismatch.
 class SideFileReader {
  public:
@@ -44,6 +45,7 @@ class SideFileReader {
 
  private:
   std::string Item();
+  [[nodiscard]] std::size_t ClosingQuote() const;
   void PassSeparator();
 
   std::string content_;

@@ -16,6 +16,9 @@ constexpr std::array<std::uint16_t, 32> kUpperControls = {
 
 constexpr std::uint32_t kNoCharacter = 0xFFFFFFFF;
 
+/// The smallest character that takes so many bytes of UTF-8.
+constexpr std::array<std::uint32_t, 5> kSmallest = {0, 0, 0x80, 0x800, 0x10000};
+
 char UpperByte(char character) {
   const auto byte = static_cast<unsigned char>(character);
   if (byte >= 'a' && byte <= 'z') return static_cast<char>(byte - 32);
@@ -65,6 +68,7 @@ std::uint32_t TakeCharacter(std::string_view& text) {
     whole = (byte & 0xC0) == 0x80;
     code = (code << 6) | (byte & 0x3FU);
   }
+  whole = whole && code >= kSmallest[length];  // no shorter form of the same character
   text.remove_prefix(whole ? length : 1);
   return whole ? code : kNoCharacter;
 }

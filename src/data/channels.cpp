@@ -119,13 +119,30 @@ void Channels::Close(Channel channel) {
 }
 
 void Channels::WriteOut(Open& open) {
-  const bool lasting = open.keeping == Keeping::Lasting;
-  const std::string path = lasting ? open.path + ".new" : open.path;
+  if (open.keeping == Keeping::Working) return WriteText(open, open.path);
+  const std::string work_file = open.path + ".new";
+  try {
+    WriteText(open, work_file);
+    files_.Replace(work_file, open.path);
+  } catch (const RunTimeError&) {
+    DeleteQuietly(work_file);
+    throw;
+  }
+}
+
+void Channels::WriteText(const Open& open, const std::string& path) {
   const auto file = files_.Open(path, OpenMode::Truncate);
   file->WriteAt(0, BytesOf(open.writer->Content()));
-  if (lasting) file->Sync();
+  if (open.keeping == Keeping::Lasting) file->Sync();
   file->Close();
-  if (lasting) files_.Replace(path, open.path);
+}
+
+void Channels::DeleteQuietly(const std::string& path) {
+  try {
+    files_.Delete(path);
+  } catch (const RunTimeError&) {
+    // It may never have been made, and what failed before is the thing to tell.
+  }
 }
 
 void Channels::CloseAll() {

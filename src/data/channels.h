@@ -90,6 +90,8 @@ class Channels {
   [[nodiscard]] Open& Random(Channel channel);
   [[nodiscard]] static std::uint64_t Position(const Open& open, int number);
   void WriteOut(Open& open);
+  void WriteText(const Open& open, const std::string& path);
+  void DeleteQuietly(const std::string& path);
   static void ReadRun(Open& open, int first, std::span<std::byte> into);
 
   FileSystem& files_;

@@ -140,8 +140,9 @@ void FaultFileSystem::Replace(const std::string& from, const std::string& to) {
 void FaultFileSystem::Copy(const std::string& from, const std::string& to) {
   const auto cut = plan_.Begin(FileOperation::Copy);
   if (!cut) return real_.Copy(from, to);
-  std::vector<std::byte> bytes(*cut);
   const auto source = real_.Open(from, OpenMode::Read);
+  std::vector<std::byte> bytes(
+      static_cast<std::size_t>(std::min<std::uint64_t>(*cut, source->Length())));
   bytes.resize(source->ReadAt(0, bytes));
   real_.Open(to, OpenMode::Truncate)->WriteAt(0, bytes);
   throw RunTimeError(plan_.cut_number_);

@@ -6,7 +6,6 @@
 
 #ifdef _WIN32
 #include <io.h>
-#include <windows.h>
 #endif
 
 #include <algorithm>
@@ -38,6 +37,7 @@ ErrorNumber NumberOfSystemError(int error) {
     case EROFS:
     case EBUSY:
     case ETXTBSY:
+    case EBADF:  // written to, but opened for reading only
       return ErrorNumber::PermissionDenied;
     case EEXIST:
       return ErrorNumber::FileAlreadyExists;
@@ -85,6 +85,7 @@ void Check(const std::error_code& error, const fs::path& path) {
 
 #ifdef _WIN32
 constexpr int kBinary = O_BINARY;
+constexpr int kSyncAccess = O_RDWR;
 int OpenDescriptor(const fs::path& path, int flags) { return _wopen(path.c_str(), flags, 0666); }
 int SyncDescriptor(int descriptor) { return _commit(descriptor); }
 void SyncFolderOf(const fs::path&) {}  // a rename reaches the disk with the volume's own journal
@@ -98,6 +99,7 @@ long WriteSome(int descriptor, const void* from, std::size_t size, std::uint64_t
 }
 #else
 constexpr int kBinary = O_CLOEXEC;
+constexpr int kSyncAccess = O_RDONLY;  // a copy may be as read-only as its source
 int OpenDescriptor(const fs::path& path, int flags) { return ::open(path.c_str(), flags, 0666); }
 int SyncDescriptor(int descriptor) { return ::fsync(descriptor); }
 void SyncFolderOf(const fs::path& path) {
@@ -150,7 +152,7 @@ class RealFile : public File {
       const long count =
           WriteSome(descriptor_, from.data() + done, from.size() - done, position + done);
       if (count < 0 && errno == EINTR) continue;
-      if (count < 0) Fail(errno, path_);
+      if (count <= 0) Fail(count < 0 ? errno : ENOSPC, path_);
       done += static_cast<std::size_t>(count);
     }
   }
@@ -171,15 +173,63 @@ class RealFile : public File {
   bool is_new_;
 };
 
-/// The entry of `folder` that is `name` in any case; `name` itself when there is none.
+/// All that lies in a folder, in no order. An error ends the walk and is told.
+std::vector<fs::directory_entry> EntriesOf(const fs::path& folder, std::error_code& error) {
+  std::vector<fs::directory_entry> entries;
+  fs::directory_iterator entry(folder, error);
+  while (!error && entry != fs::directory_iterator()) {
+    entries.push_back(*entry);
+    entry.increment(error);
+  }
+  return entries;
+}
+
+/// The entry of `folder` that is `name` in any case; `name` itself when there is none. A name with
+/// characters that a text cannot hold is none: two such names may read alike.
 fs::path EntryInAnyCase(const fs::path& folder, const fs::path& name) {
   std::error_code error;
   if (fs::exists(folder / name, error)) return folder / name;
   const std::string wanted = TextOfPath(name);
-  for (const auto& entry : fs::directory_iterator(folder, error)) {
-    if (EqualsIgnoringCase(TextOfPath(entry.path().filename()), wanted)) return entry.path();
+  for (const fs::directory_entry& entry : EntriesOf(folder, error)) {
+    const fs::path found = entry.path().filename();
+    const std::string text = TextOfPath(found);
+    if (EqualsIgnoringCase(text, wanted) && PathOfText(text) == found) return entry.path();
   }
   return folder / name;
+}
+
+/// Nobody may write to it. A rename or a removal would not ask.
+void RefuseProtected(const fs::path& path) {
+  constexpr fs::perms kWriters =
+      fs::perms::owner_write | fs::perms::group_write | fs::perms::others_write;
+  std::error_code error;
+  const fs::file_status status = fs::status(path, error);
+  if (fs::exists(status) && (status.permissions() & kWriters) == fs::perms::none) {
+    throw RunTimeError(ErrorNumber::PermissionDenied);
+  }
+}
+
+/// Returns once a file, and its name, have reached the disk.
+void SyncFile(const fs::path& path) {
+  const int descriptor = OpenDescriptor(path, kSyncAccess | kBinary);
+  if (descriptor < 0) return;  // one that may not be opened is left to the system
+  RealFile file(descriptor, path, true);
+  file.Sync();
+  file.Close();
+}
+
+/// Puts a file in the place of one on another volume: by a copy beside it.
+void ReplaceAcrossVolumes(const fs::path& source, const fs::path& target) {
+  fs::path copy = target;
+  copy += ".new";
+  std::error_code error;
+  fs::copy_file(source, copy, fs::copy_options::overwrite_existing, error);
+  Check(error, copy);
+  SyncFile(copy);
+  fs::rename(copy, target, error);
+  Check(error, target);
+  SyncFolderOf(target);
+  fs::remove(source, error);
 }
 
 }  // namespace
@@ -198,7 +248,10 @@ std::string FileNameOf(const std::string& path) {
   return separator == std::string::npos ? path : path.substr(separator + 1);
 }
 
-RealFileSystem::RealFileSystem() : current_(fs::current_path()) {}
+RealFileSystem::RealFileSystem() {
+  std::error_code error;
+  current_ = fs::current_path(error);
+}
 
 std::filesystem::path RealFileSystem::Located(const std::string& path) const {
   if (path.empty() || path.find('\0') != std::string::npos) {
@@ -228,7 +281,7 @@ std::unique_ptr<File> RealFileSystem::Open(const std::string& path, OpenMode mod
   const int emptying = mode == OpenMode::Truncate ? O_TRUNC : 0;
   int descriptor = OpenDescriptor(located, O_RDWR | O_CREAT | emptying | kBinary);
   if (descriptor < 0 && mode == OpenMode::ReadWrite && !is_new &&
-      (errno == EACCES || errno == EROFS)) {
+      (errno == EACCES || errno == EPERM || errno == EROFS)) {
     // A season on a read-only disk can still be looked at; only a write to it fails.
     descriptor = OpenDescriptor(located, O_RDONLY | kBinary);
   }
@@ -245,6 +298,7 @@ void RealFileSystem::Delete(const std::string& path) {
   const fs::path located = Located(path);
   std::error_code error;
   if (fs::is_directory(located, error)) throw RunTimeError(ErrorNumber::PathFileAccess);
+  RefuseProtected(located);
   const bool was_there = fs::remove(located, error);
   Check(error, located);
   if (!was_there) Fail(ENOENT, located);
@@ -263,10 +317,17 @@ void RealFileSystem::Rename(const std::string& from, const std::string& to) {
 
 void RealFileSystem::Replace(const std::string& from, const std::string& to) {
   const fs::path source = Located(from);
-  const fs::path target = Located(to);
   std::error_code error;
+  // A link stays a link; what it stands for is replaced.
+  fs::path target = fs::weakly_canonical(Located(to), error);
+  if (error) target = Located(to);
   if (!fs::exists(source, error)) Fail(ENOENT, source);
+  if (fs::is_directory(target, error)) throw RunTimeError(ErrorNumber::PathFileAccess);
+  RefuseProtected(target);
+  const fs::file_status old = fs::status(target, error);
+  if (fs::exists(old)) fs::permissions(source, old.permissions(), error);
   fs::rename(source, target, error);
+  if (error == std::errc::cross_device_link) return ReplaceAcrossVolumes(source, target);
   Check(error, target);
   SyncFolderOf(target);
 }
@@ -275,16 +336,20 @@ void RealFileSystem::Copy(const std::string& from, const std::string& to) {
   const fs::path source = Located(from);
   const fs::path target = Located(to);
   std::error_code error;
+  if (!fs::exists(source, error)) Fail(ENOENT, source);
+  if (fs::is_directory(source, error) || fs::is_directory(target, error)) {
+    throw RunTimeError(ErrorNumber::PathFileAccess);
+  }
   fs::copy_file(source, target, fs::copy_options::overwrite_existing, error);
-  Check(error, source);
+  Check(error, target);
+  SyncFile(target);
 }
 
 void RealFileSystem::MakeFolder(const std::string& path) {
   const fs::path located = Located(path);
   std::error_code error;
-  if (!fs::create_directory(located, error) && !error) {
-    throw RunTimeError(ErrorNumber::PathFileAccess);  // it is there already
-  }
+  if (fs::exists(located, error)) throw RunTimeError(ErrorNumber::PathFileAccess);
+  fs::create_directory(located, error);
   Check(error, located);
 }
 
@@ -299,10 +364,11 @@ void RealFileSystem::RemoveFolder(const std::string& path) {
 std::vector<FolderEntry> RealFileSystem::List(const std::string& folder) {
   const fs::path located = Located(folder);
   std::error_code error;
-  fs::directory_iterator entries(located, error);
+  const auto entries = EntriesOf(located, error);
   Check(error, located);
   std::vector<FolderEntry> list;
-  for (const auto& entry : entries) {
+  list.reserve(entries.size());
+  for (const fs::directory_entry& entry : entries) {
     list.push_back({TextOfPath(entry.path().filename()), entry.is_directory(error)});
   }
   std::sort(list.begin(), list.end(), [](const FolderEntry& a, const FolderEntry& b) {

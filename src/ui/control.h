@@ -98,6 +98,8 @@ class Control {
   /// Reached by Tab. Left off for what only the pointer should reach.
   [[nodiscard]] bool TabStop() const { return tab_stop_; }
   void SetTabStop(bool tab_stop) { tab_stop_ = tab_stop; }
+  /// Where Tab stops as things stand: of options, only at the selected one.
+  [[nodiscard]] virtual bool ReachedByTab() const { return tab_stop_; }
 
   /// Puts the focus here: LostFocus of the control left, then GotFocus. Nothing happens where the
   /// focus cannot go.

@@ -11,14 +11,24 @@ void TextBox::SetText(std::string_view text) {
   if (Assign(text_, text)) Fire(Change);
 }
 
-void OptionButton::SetValue(bool value) {
-  Assign(value_, value);
-  if (!value) return;
+template <typename Visit>
+void OptionButton::ForEachPeer(Visit visit) const {
   for (Control* other : InScreen().Controls()) {
     if (other != this && other->GetKind() == Kind::Option && other->InControl() == InControl()) {
-      static_cast<OptionButton*>(other)->SetValue(false);
+      visit(static_cast<OptionButton&>(*other));
     }
   }
+}
+
+void OptionButton::SetValue(bool value) {
+  Assign(value_, value);
+  if (value) ForEachPeer([](OptionButton& other) { other.SetValue(false); });
+}
+
+bool OptionButton::ReachedByTab() const {
+  bool other_selected = false;
+  ForEachPeer([&](const OptionButton& other) { other_selected |= other.Value() && other.Live(); });
+  return Control::ReachedByTab() && !other_selected;
 }
 
 const std::string& LineHolder::Line(int index) const {

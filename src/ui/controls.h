@@ -82,10 +82,16 @@ class OptionButton : public Control {
       : Control(owner, Kind::Option, name, caption) {}
   [[nodiscard]] bool TakesFocus() const override { return true; }
 
+  [[nodiscard]] bool ReachedByTab() const override;
+
   [[nodiscard]] bool Value() const { return value_; }
   void SetValue(bool value);
 
  private:
+  /// Calls `visit` for each of the other options in the same panel.
+  template <typename Visit>
+  void ForEachPeer(Visit visit) const;
+
   bool value_ = false;
 };
 

@@ -1,6 +1,7 @@
 #include "ui/dispatcher.h"
 
 #include <new>
+#include <stdexcept>
 
 #include "data/runtime_error.h"
 
@@ -30,6 +31,8 @@ bool Dispatcher::Run(const Handler& handler) {
     report_(error.Number());
   } catch (const std::bad_alloc&) {
     report_(static_cast<int>(ErrorNumber::OutOfMemory));
+  } catch (const std::logic_error&) {
+    report_(static_cast<int>(ErrorNumber::InternalError));  // a fault of our own: the user goes on
   }
   return false;
 }

@@ -66,6 +66,7 @@ Outcome Hand::Whole(const Handler& action) {
 /// acted on; otherwise the action is lost.
 Outcome Hand::Act(Control& control, const Handler& action) {
   bool lost = true;
+  open_menu_ = nullptr;
   Whole([&] {
     screens_.BringToFront(control.InScreen());
     lost = !TakeFocus(control);
@@ -99,11 +100,17 @@ void Hand::ClickWithFocus(Control& control) {
   control.Fire(control.Click);
 }
 
-Outcome Hand::DoubleClick(Control& control) {
-  const Outcome outcome = Click(control);
+/// A double click, after the click that comes with it. That one may have closed the screen.
+Outcome Hand::Twice(Control& control, const std::function<Outcome()>& click) {
+  const auto held = screens_.Hold(control.InScreen());
+  const Outcome outcome = click();
   if (!outcome.Done() || outcome.lost || !control.DoubleClick || !control.Live()) return outcome;
   Whole([&] { control.Fire(control.DoubleClick); });
   return outcome;
+}
+
+Outcome Hand::DoubleClick(Control& control) {
+  return Twice(control, [&] { return Click(control); });
 }
 
 Outcome Hand::Type(Control& control, std::string_view text) {
@@ -113,7 +120,8 @@ Outcome Hand::Type(Control& control, std::string_view text) {
     // What is typed first replaces the text that was marked; all else stands behind what the box
     // then holds, as it does for a person.
     AssignText(control, text.substr(0, 1));
-    for (std::size_t i = 1; i < text.size() && control.Live(); ++i) {
+    const auto still_there = [&] { return control.InScreen().Focus() == &control; };
+    for (std::size_t i = 1; i < text.size() && still_there(); ++i) {
       AssignText(control, TextOf(control) + text[i]);
     }
   });
@@ -125,26 +133,27 @@ Outcome Hand::Retype(Control& control, std::string_view text) {
   return Act(control, [&] { AssignText(control, text); });
 }
 
+/// Makes a line the current one, and the only marked one where lines are marked.
+void Hand::PickLine(LineHolder& list, int line) {
+  if (auto* marks = As<ListBox>(list); marks != nullptr && marks->Multi()) {
+    marks->ClearMarks();
+    marks->SetMarked(line, true);
+  }
+  list.SetIndex(line);
+}
+
 Outcome Hand::Pick(Control& control, int line) {
   if (const Outcome check = CheckLive(control); !check.Done()) return check;
   auto* const list = As<LineHolder>(control);
   if (list == nullptr) return Refused(control, "has no lines");
   if (line < 0 || line >= list->Count()) return Refused(control, "has no such line");
   return Act(control, [=] {
-    if (line >= list->Count()) return;
-    if (auto* marks = As<ListBox>(*list); marks != nullptr && marks->Multi()) {
-      marks->ClearMarks();
-      marks->SetMarked(line, true);
-    }
-    list->SetIndex(line);
+    if (line < list->Count()) PickLine(*list, line);
   });
 }
 
 Outcome Hand::PickTwice(Control& control, int line) {
-  const Outcome outcome = Pick(control, line);
-  if (!outcome.Done() || outcome.lost || !control.DoubleClick || !control.Live()) return outcome;
-  Whole([&] { control.Fire(control.DoubleClick); });
-  return outcome;
+  return Twice(control, [&] { return Pick(control, line); });
 }
 
 Outcome Hand::Select(Control& control, const std::vector<int>& lines) {
@@ -185,10 +194,7 @@ Outcome Hand::ClickCell(Control& control, int row, int col) {
 }
 
 Outcome Hand::DoubleClickCell(Control& control, int row, int col) {
-  const Outcome outcome = ClickCell(control, row, col);
-  if (!outcome.Done() || outcome.lost || !control.DoubleClick || !control.Live()) return outcome;
-  Whole([&] { control.Fire(control.DoubleClick); });
-  return outcome;
+  return Twice(control, [&] { return ClickCell(control, row, col); });
 }
 
 Outcome Hand::PickDate(Control& control, Date date) {
@@ -266,7 +272,7 @@ void Hand::PressEnter(Control* focus, Screen& front) {
         return;
       case Kind::List:
         if (auto& list = static_cast<ListBox&>(*focus); list.PicksOnEnter()) {
-          if (list.Cursor() >= 0) list.SetIndex(list.Cursor());
+          if (list.Cursor() >= 0) PickLine(list, list.Cursor());
           return;
         }
         break;
@@ -282,11 +288,10 @@ void Hand::MoveLine(LineHolder& list, int step) {
     box->SetCursor(std::clamp(box->Cursor() + step, 0, std::max(box->Count() - 1, 0)));
     return;
   }
-  const int line = std::clamp(list.Index() + step, 0, list.Count() - 1);
-  if (list.Count() > 0 && line != list.Index()) {
-    list.SetIndex(line);
-    list.Fire(list.KeyUp);
-  }
+  const int line = std::clamp(list.Index() + step, 0, std::max(list.Count() - 1, 0));
+  if (list.Count() == 0 || line == list.Index()) return;
+  PickLine(list, line);
+  list.Fire(list.KeyUp);
 }
 
 /// The arrow keys go from picture to picture, and from option to option, which selects it.
@@ -303,8 +308,7 @@ void Hand::MoveAmong(Control& focus, bool backward) {
   const auto next = present + (backward ? -1 : 1);
   if (next < 0 || next >= static_cast<std::ptrdiff_t>(peers.size())) return;
   Control& target = *peers[static_cast<std::size_t>(next)];
-  target.SetFocus();
-  if (target.GetKind() == Kind::Option) ClickWithFocus(target);
+  if (TakeFocus(target) && target.GetKind() == Kind::Option) ClickWithFocus(target);
 }
 
 Outcome Hand::PressMnemonic(char letter) {
@@ -327,17 +331,20 @@ Control* Hand::WithMnemonic(const Screen& front, char letter) const {
     for (Control* control : front.Controls()) {
       const bool in_reach =
           control->GetKind() == Kind::Menu ? control->InControl() == menu : menu == nullptr;
-      if (in_reach && control->Live() && MnemonicOf(control->Caption()) == letter) return control;
+      if (!in_reach || !control->Live() || MnemonicOf(control->Caption()) != letter) continue;
+      if (control->TakesFocus() || CanBeClicked(*control)) return control;
     }
   }
   return nullptr;
 }
 
 char MnemonicOf(std::string_view caption) {
-  const auto mark = caption.find('&');
-  if (mark == std::string_view::npos || mark + 1 >= caption.size()) return 0;
-  const char letter = UpperCase(caption.substr(mark + 1, 1)).front();
-  return letter == '&' || letter == ' ' ? '\0' : letter;
+  for (std::size_t i = 0; i + 1 < caption.size(); ++i) {
+    if (caption[i] != '&') continue;
+    const char letter = caption[++i];
+    if (letter != '&' && letter != ' ') return UpperCase(std::string(1, letter)).front();
+  }
+  return 0;
 }
 
 }  // namespace marlowbeck

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <functional>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -51,10 +52,12 @@ class Hand {
  private:
   Outcome Act(Control& control, const Handler& action);
   Outcome Whole(const Handler& action);
+  Outcome Twice(Control& control, const std::function<Outcome()>& click);
   bool TakeFocus(Control& control);
   void ClickWithFocus(Control& control);
   void PressOn(Control* focus, Screen& front, Key key);
   void PressEnter(Control* focus, Screen& front);
+  static void PickLine(LineHolder& list, int line);
   void MoveLine(LineHolder& list, int step);
   void MoveAmong(Control& focus, bool backward);
   [[nodiscard]] Control* WithMnemonic(const Screen& front, char letter) const;

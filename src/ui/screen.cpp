@@ -51,13 +51,9 @@ void Screen::MoveFocusTo(Control& control) {
 }
 
 void Screen::EnsureFocus() {
-  if (Focus() != nullptr) return;
-  const auto first = std::find_if(controls_.begin(), controls_.end(), [](const Control* control) {
-    return control->TakesFocus() && control->TabStop() && control->Live();
-  });
-  focus_ = first == controls_.end() ? nullptr : *first;
+  Control* const wanted = Focus() != nullptr ? focus_ : NextStop(false);
+  if (std::exchange(focus_, wanted) != wanted) ++revision_;
   entered_ = focus_;
-  ++revision_;
 }
 
 Control* Screen::NextStop(bool backward) const {
@@ -68,7 +64,7 @@ Control* Screen::NextStop(bool backward) const {
                                 : static_cast<std::size_t>(present - controls_.begin());
   for (std::size_t step = 1; step <= count; ++step) {
     Control* const control = controls_[(start + (backward ? count - step : step)) % count];
-    if (control->TakesFocus() && control->TabStop() && control->Live()) return control;
+    if (control->TakesFocus() && control->ReachedByTab() && control->Live()) return control;
   }
   return nullptr;
 }

@@ -36,7 +36,8 @@ class Screen {
   /// The control that has the focus while this screen is in front; null for none.
   [[nodiscard]] Control* Focus() const;
   void MoveFocusTo(Control& control);
-  /// Puts the focus of a screen that has none on its first live tab stop, without an event.
+  /// Puts the focus of a screen that has none on a live tab stop, without an event: on the one that
+  /// follows the control that had it, or else on the first.
   void EnsureFocus();
   /// The live tab stop that follows, or comes before, the focus; null when there is none.
   [[nodiscard]] Control* NextStop(bool backward) const;

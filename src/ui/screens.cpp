@@ -19,6 +19,12 @@ Screen* Screens::Find(std::string_view name) const {
   return nullptr;
 }
 
+std::shared_ptr<Screen> Screens::Hold(const Screen& screen) const {
+  const auto place = std::find_if(loaded_.begin(), loaded_.end(),
+                                  [&](const auto& loaded) { return loaded.get() == &screen; });
+  return place == loaded_.end() ? nullptr : *place;
+}
+
 Screen* Screens::Load(std::string_view name) {
   if (Screen* const screen = Find(name)) return screen;
   const auto factory = factories_.find(UpperCase(name));

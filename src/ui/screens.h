@@ -38,6 +38,8 @@ class Screens {
   void HideQuietly(Screen& screen);
 
   [[nodiscard]] Screen* Find(std::string_view name) const;
+  /// Keeps a loaded screen in being, also when it is unloaded in the meantime.
+  [[nodiscard]] std::shared_ptr<Screen> Hold(const Screen& screen) const;
   /// The topmost visible screen; null for none.
   [[nodiscard]] Screen* Front() const;
   void BringToFront(Screen& screen);

@@ -50,8 +50,13 @@ struct ScreenState {
   bool enabled = false;
 };
 
-/// Where the answers of boxes come from and where what was asked is told. Throws when a box keeps
-/// coming back with nothing waiting for it.
+/// Thrown out of a box that keeps coming back with nothing waiting for it: the event is given up.
+/// No failure of the program, so that nothing in the program catches it. A face lets it through to
+/// whoever called Perform, or Start.
+struct BrokenOff {};
+
+/// Where the answers of boxes come from and where what was asked is told. Throws BrokenOff when a
+/// box keeps coming back with nothing waiting for it.
 class BoxAnswers {
  public:
   virtual ~BoxAnswers() = default;
@@ -62,7 +67,7 @@ class BoxAnswers {
 };
 
 /// The script's eyes and hands: works the screens of a program and reads what they show. One face
-/// works the models, another real windows.
+/// works the models, another real windows. It is made before its program and goes before it.
 class Face {
  public:
   virtual ~Face() = default;
@@ -74,6 +79,8 @@ class Face {
   /// Brings what is seen up to date: after the start, and where the program asks for it.
   virtual void Refresh() = 0;
 
+  /// Does what a person would. Refuses it, in words that name the control, where a person could
+  /// not; everything that it set off is over when this returns.
   virtual Outcome Perform(const Action& action) = 0;
   virtual ControlState Read(const Control& control) = 0;
   virtual ScreenState Read(const Screen& screen) = 0;
@@ -81,7 +88,8 @@ class Face {
   virtual std::string FrontScreen() = 0;
   virtual std::string FocusedControl() = 0;  ///< "frmResults.txtAgg"
   /// Takes a picture of the screen in front into a PNG file, brought to a size first when one is
-  /// given. Answers the picture's width and height; nothing where there are no windows.
+  /// given. Answers the picture's width and height; nothing where there are no windows, or the
+  /// file cannot be written. `file` is UTF-8.
   virtual std::optional<std::pair<int, int>> Shot(const std::string& file,
                                                   std::optional<std::pair<int, int>> size) = 0;
 };
@@ -89,7 +97,8 @@ class Face {
 /// The face on models alone.
 std::unique_ptr<Face> MakeModelFace(BoxAnswers& answers);
 
-/// The face on real windows; null where the driver was built without them.
+/// The face on real windows; null where the driver was built without them. May be called again in
+/// the same process once the face made before has gone.
 std::unique_ptr<Face> MakeWindowFace(BoxAnswers& answers, int& argc, char** argv);
 
 }  // namespace marlowbeck

@@ -1,0 +1,34 @@
+#include "drive/names.h"
+
+#include "drive/refusal.h"
+
+namespace marlowbeck {
+
+Screen& ScreenNamed(const std::string& name, const Screens& screens) {
+  if (Screen* const screen = screens.Find(name)) return *screen;
+  throw Refusal("there is no screen " + name + " now");
+}
+
+Screen& ScreenInFront(const Screens& screens) {
+  if (Screen* const front = screens.Front()) return *front;
+  throw Refusal("no screen is in front");
+}
+
+Control& ControlNamed(const std::string& name, const Screens& screens) {
+  const auto dot = name.find('.');
+  const Screen& screen =
+      dot == std::string::npos ? ScreenInFront(screens) : ScreenNamed(name.substr(0, dot), screens);
+  const std::string own = dot == std::string::npos ? name : name.substr(dot + 1);
+  if (Control* const control = screen.Find(own)) return *control;
+  throw Refusal(screen.Name() + " has no control " + own);
+}
+
+Screen& TakeScreen(Arguments& arguments, const Screens& screens) {
+  return ScreenNamed(arguments.Word("screen"), screens);
+}
+
+Control& TakeControl(Arguments& arguments, const Screens& screens) {
+  return ControlNamed(arguments.Word("control"), screens);
+}
+
+}  // namespace marlowbeck

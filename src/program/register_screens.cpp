@@ -2,6 +2,7 @@
 
 #include <memory>
 
+#include "results/frmResults.h"
 #include "session/frmAbout.h"
 #include "session/frmBuend.h"
 #include "session/frmDB.h"
@@ -23,6 +24,7 @@ void RegisterScreens(Screens& screens, const Context& context) {
   Register<frmBuend>(screens, "frmBuend", context);
   Register<frmSort>(screens, "frmSort", context);
   Register<frmAbout>(screens, "frmAbout", context);
+  Register<frmResults>(screens, "frmResults", context);
   Register<frmErrors>(screens, "frmErrors", context);
 }
 

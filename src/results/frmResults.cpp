@@ -1,0 +1,130 @@
+#include "results/frmResults.h"
+
+#include "data/competition.h"
+#include "ui/screens.h"
+
+namespace marlowbeck {
+namespace {
+
+constexpr const char* kSortFile = "resfile.qz3";
+constexpr int kHelpTopic = 140;
+
+}  // namespace
+
+frmResults::frmResults(Screens& screens, const Context& context)
+    : Screen(screens, "frmResults", "[Marlowbeck]  Results Entry"), context_(context) {
+  cboResGrade.Click = [this] { cmdGotoResults.SetFocus(); };
+  Cal.Change = [this] { Cal_Change(); };
+  cmdGotoResults.Click = [this] { StartScores(); };
+  cmdExit.Click = [this] { cmdExit_Click(); };
+  cmdHelp1.Click = [this] { OpenHelp(); };
+
+  cboResTeam.Click = [this] { cboResTeam_Click(); };
+  cboOpp.Click = [this] { cboOpp_Click(); };
+  lstResPlayers.Click = [this] { lstResPlayers_Click(); };
+  lstFinished.Click = [this] { lstFinished_Click(); };
+  lstResPlayers.SetPicksOnEnter(true);
+  lstFinished.SetPicksOnEnter(true);
+
+  cmdChangeGrade.Click = [this] { cmdChangeGrade_Click(); };
+  cmdLeaveResults.Click = [this] { InScreens().Unload(*this); };
+  cmdFirst.Click = [this] { cmdFirst_Click(); };
+  cmdPrevDate.Click = [this] { cmdPrevDate_Click(); };
+  cmdNextDate.Click = [this] { cmdNextDate_Click(); };
+  cmdLast.Click = [this] { cmdLast_Click(); };
+  cmdMakeWorkDate.Click = [this] { cmdMakeWorkDate_Click(); };
+
+  txtAgg.LostFocus = [this] { txtAgg_LostFocus(); };
+  txtShots.LostFocus = [this] { txtShots_LostFocus(); };
+  txtHowMany180s.LostFocus = [this] { CheckCenturies(); };
+  for (TextBox& peg : txtP) peg.LostFocus = [this, &peg] { CheckPeg(peg); };
+  chkFF.Click = [this] { chkFF_Click(); };
+  cmdSave.Click = [this] { cmdSave_Click(); };
+  cmdClearRes.Click = [this] { cmdClearRes_Click(); };
+  cmdResultsCancel.Click = [this] { RePick(); };
+  EdCal.Change = [this] { EdCal_Change(); };
+
+  for (TextBox* shown_only : {&txtDayName, &txtAvg}) {
+    shown_only->SetLocked(true);
+    shown_only->SetTabStop(false);
+  }
+  fraResults.SetMeaning(Meaning::Black);
+  Defaults = {&cmdSave, &cmdGotoResults};
+  Cancels = {&cmdResultsCancel, &cmdExit};
+  Helps = {&cmdHelp1};
+}
+
+void frmResults::Load() {
+  for (Label& header : lblHeader) header.Hide();
+  for (Panel* panel : {&fraTeams, &panResAddPlayer, &fraReDoOpp}) panel->Hide();
+  Start();
+}
+
+void frmResults::Activate() {
+  // What another screen has left in it is no failed check of this one.
+  context_.session.Flag = 0;
+}
+
+void frmResults::HelpKey() { OpenHelp(); }
+
+void frmResults::OpenHelp() { context_.platform.help.Open("qz1.HLP", kHelpTopic); }
+
+void frmResults::cmdExit_Click() {
+  if (fraTeams.Visible()) {
+    StartScores();
+  } else {
+    InScreens().Unload(*this);
+  }
+}
+
+void frmResults::Unload() {
+  const char* next = "frmDB";
+  try {
+    if (IsOutOfOrder() && InScreens().Knows("frmSort")) {
+      NameFileToSort();
+      next = "frmSort";
+    }
+  } catch (const RunTimeError&) {
+    // The person must not be left without a screen.
+    context_.channels.AbandonAll();
+    InScreens().Show("frmDB");
+    throw;
+  }
+  InScreens().Show(next);
+}
+
+bool frmResults::IsOutOfOrder() {
+  OpenResultSFile(context_.session, context_.channels);
+  if (context_.session.ResultsFile.empty()) return false;
+  bool ascending = true;
+  Date before;
+  ForEachResult([&](const ResultView& result, int number) {
+    ascending = number == 1 || !(result.GameDate() < before);
+    before = result.GameDate();
+    return ascending;
+  });
+  context_.channels.CloseAll();
+  return !ascending;
+}
+
+void frmResults::NameFileToSort() {
+  context_.GoToWorkingFolder();
+  WriteOneString(context_.channels, kSortFile, context_.session.ResultsFile);
+}
+
+void frmResults::ForEachResult(const std::function<bool(const ResultView&, int)>& visit) {
+  const int total = context_.channels.RecordCount(Channel::Results);
+  context_.channels.ForEachRecord(Channel::Results, [&](Bytes bytes, int number) {
+    const bool go_on = visit(ResultView(bytes), number);
+    if (!go_on || number == total) record_ = DecodeResult(bytes);
+    return go_on;
+  });
+}
+
+void frmResults::ReadRecord(int number) {
+  ResultBytes bytes{};
+  context_.channels.Get(Channel::Results, number, bytes);
+  record_ = DecodeResult(bytes);
+}
+
+}  // namespace marlowbeck

@@ -1,0 +1,227 @@
+// Opening and closing a score sheet: the player, the boxes that his grade has, and the figures of a
+// saved one.
+
+#include "data/competition.h"
+#include "data/numbers.h"
+#include "data/text.h"
+#include "results/frmResults.h"
+#include "results/player_listing.h"
+#include "results/quiet_spell.h"
+#include "session/messages.h"
+
+namespace marlowbeck {
+namespace {
+
+void FillAboveZero(TextBox& box, int value) {
+  if (value > 0) box.SetText(NumberText(value));
+}
+
+}  // namespace
+
+void frmResults::lstResPlayers_Click() {
+  if (lstFinished.Count() >= kPlayersOfATeam) {
+    const int answer =
+        WarningYesNo(context_, Lines({"6 Players have been entered.", "Are you sure you need to",
+                                      "enter more than 6 results?"}));
+    if (answer == kAnswerNo) return;
+  }
+  EnableBoxes();
+  const QuietSpell quiet(context_.session.Quiet);
+  GotPlayer();
+}
+
+void frmResults::GotPlayer() {
+  Session& session = context_.session;
+  session.EditRecord = 0;
+  cboResTeam.Enable();
+  fraResults.SetMeaning(Meaning::Black);
+  fraResults.SetCaption("Enter Player's Scores");
+  ClearResults();
+  ChangeOpp();
+  if (!session.Quiet && lstFinished.Count() >= kPlayersOfATeam) {
+    Warning(context_, "Six Players for " + session.Team + " have been entered.");
+    return GetPlayers();
+  }
+  if (FindPlayer(lstResPlayers)) {
+    fraEdButtons.Hide();
+    fraResControls.Hide();
+  }
+  WhichBoxes();
+  // The three games of a grade without any best of three are one leg each.
+  if (session.BestOfThree == 111) txtLegs.SetText("3");
+  if (!panPlrID.Caption().empty()) txtAgg.SetFocus();
+}
+
+/// Shows the sheet of the first player whose name is the selected line; false when there is none.
+bool frmResults::FindPlayer(const ListBox& list) {
+  if (list.Index() < 0) return false;
+  const Session& session = context_.session;
+  const std::string line = list.Line(list.Index());
+  bool found = false;
+  OpenFile(context_.session, context_.channels);
+  context_.channels.ForEachRecord(Channel::Players, [&](Bytes bytes, int) {
+    const PlayerView player(bytes);
+    found = player.FullName(kSheetNameSeparator) == line && player.Grade() == session.Grade &&
+            player.Team() == session.Team;
+    if (found) ShowPlayer(DecodePlayer(bytes));
+    return !found;
+  });
+  context_.channels.CloseAll();
+  return found;
+}
+
+void frmResults::ShowPlayer(const PlayerRecord& player) {
+  fraResults.Show();
+  panFirstName.SetCaption(player.FirstName + " ");
+  panSurname.SetCaption(player.Surname + " ");
+  panPlrID.SetCaption(std::to_string(player.ID));
+}
+
+void frmResults::lstFinished_Click() {
+  Session& session = context_.session;
+  EnableBoxes();
+  ClearResults();
+  if (FindPlayer(lstFinished)) txtAgg.SetFocus();
+  session.EditRecord = 0;
+  const int number = FindSavedResult();
+  if (number == 0) return;
+  session.EditRecord = number;
+  WhichBoxes();
+  FillSheet();
+  ShowForCorrection();
+}
+
+/// The last result of the player in hand for this team, opposition and date, which is then in the
+/// record buffer; 0 for none.
+int frmResults::FindSavedResult() {
+  const Session& session = context_.session;
+  const auto id = static_cast<std::int32_t>(Val(panPlrID.Caption()));
+  const std::string opposition = Trim(cboOpp.Text());
+  int found = 0;
+  OpenResultSFile(context_.session, context_.channels);
+  ForEachResult([&](const ResultView& result, int number) {
+    if (result.GameDate() == session.WorkDate && result.ID() == id &&
+        result.Team() == session.Team && result.Opposition() == opposition) {
+      found = number;
+    }
+    return true;
+  });
+  if (found > 0) ReadRecord(found);
+  context_.channels.CloseAll();
+  return found;
+}
+
+void frmResults::FillSheet() {
+  txtAgg.SetText(NumberText(record_.Aggregate));
+  txtShots.SetText(NumberText(record_.Shots));
+  ShowAverage();
+  FillScores();
+  FillAboveZero(txtLegs, record_.Legs);
+}
+
+/// Those that are filled only where there is something. Old pegs go into hidden boxes too, so that
+/// they are still there after the next save.
+void frmResults::FillScores() {
+  FillAboveZero(txtHS, record_.HighScore);
+  FillAboveZero(txtCent, record_.Centuries);
+  FillAboveZero(txtHowMany180s, record_.Scores180);
+  for (std::size_t i = 0; i < txtP.size(); ++i) FillAboveZero(txtP[i], record_.Pegs[i]);
+}
+
+void frmResults::ShowForCorrection() {
+  fraResults.SetCaption("EDIT Player's Score");
+  fraResults.SetMeaning(Meaning::Red);
+  cboResTeam.Disable();
+  fraEdButtons.Show();
+  EdCal.SetValue(context_.session.WorkDate);
+  fraResControls.Hide();
+  fraTeams.Hide();
+  if (Trimmed(record_.Forfeit) != "F") return;
+  chkFF.SetValue(true);
+  DisableBoxes();
+}
+
+void frmResults::GetOldScores() {
+  WhichBoxes();
+  OpenResultSFile(context_.session, context_.channels);
+  ReadRecord(context_.session.EditRecord);
+  context_.channels.CloseAll();
+  txtAgg.SetText(NumberText(record_.Aggregate));
+  txtShots.SetText(NumberText(record_.Shots));
+  // KEPT: a restored average stands as a plain number, 47.5 for 47.50; a repair would give it two
+  // places.
+  const bool has_average = record_.Aggregate > 0 && record_.Shots > 0;
+  txtAvg.SetText(has_average ? NumberText(SheetAverage(record_.Aggregate, record_.Shots)) : "");
+  // KEPT: the legs are not restored with the other figures; a repair would fill txtLegs too.
+  FillScores();
+}
+
+void frmResults::GetNoP() {
+  Session& session = context_.session;
+  session.BestOfThree = 0;
+  OpenFile(session, context_.channels);
+  context_.channels.ForEachRecord(Channel::Players, [&](Bytes bytes, int) {
+    const PlayerView player(bytes);
+    if (player.Grade() != lblHeader[0].Caption()) return true;
+    session.BestOfThree = player.BestOfThree();
+    return false;
+  });
+  context_.channels.CloseAll();
+}
+
+void frmResults::WhichBoxes() {
+  GetNoP();
+  const PegBoxes boxes = PegBoxesFor(context_.session.BestOfThree, context_.session.GameNames);
+  for (std::size_t i = 0; i < txtP.size(); ++i) {
+    lblP[i].SetCaption(boxes.captions[i]);
+    lblP[i].SetVisible(boxes.shown[i]);
+    txtP[i].SetVisible(boxes.shown[i]);
+  }
+}
+
+void frmResults::ClearResults() {
+  for (Control* control : Controls()) {
+    if (control->GetKind() == Kind::Text) static_cast<TextBox*>(control)->SetText("");
+  }
+  for (Panel* panel : {&panSurname, &panFirstName, &panPlrID}) panel->SetCaption("");
+}
+
+std::array<TextBox*, 13> frmResults::ScoreBoxes() {
+  return {&txtAgg,  &txtShots, &txtAvg,  &txtHS,   &txtCent, &txtHowMany180s, &txtP[0],
+          &txtP[1], &txtP[2],  &txtP[3], &txtP[4], &txtP[5], &txtLegs};
+}
+
+void frmResults::EnableBoxes() {
+  for (TextBox* box : ScoreBoxes()) box->Enable();
+  chkFF.SetValue(false);
+}
+
+void frmResults::DisableBoxes() {
+  for (TextBox* box : ScoreBoxes()) box->Disable();
+}
+
+void frmResults::BlankScores() {
+  for (TextBox* box : ScoreBoxes()) box->SetText("");
+}
+
+void frmResults::chkFF_Click() {
+  if (!chkFF.Value()) {
+    for (TextBox* box : ScoreBoxes()) box->Enable();
+    return;
+  }
+  BlankScores();
+  DisableBoxes();
+}
+
+void frmResults::cmdClearRes_Click() {
+  EnableBoxes();
+  BlankScores();
+  txtAgg.SetFocus();
+}
+
+void frmResults::EdCal_Change() {
+  txtAgg.SetFocus();
+  Heading();
+}
+
+}  // namespace marlowbeck

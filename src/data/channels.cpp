@@ -118,23 +118,33 @@ void Channels::Close(Channel channel) {
   open.file->Close();
 }
 
-void Channels::WriteOut(Open& open) {
-  if (open.keeping == Keeping::Working) return WriteText(open, open.path);
-  const std::string work_file = open.path + ".new";
+void Channels::WriteOut(const Open& open) {
+  const std::string& content = open.writer->Content();
+  if (open.keeping == Keeping::Lasting) return ReplaceWhole(open.path, content);
+  const auto file = files_.Open(open.path, OpenMode::Truncate);
+  file->WriteAt(0, BytesOf(content));
+  file->Close();
+}
+
+std::string Channels::ReadWhole(const std::string& path) {
+  const auto file = files_.Open(path, OpenMode::Read);
+  std::string content = TextOf(*file);
+  file->Close();
+  return content;
+}
+
+void Channels::ReplaceWhole(const std::string& path, const std::string& content) {
+  const std::string work_file = path + ".new";
   try {
-    WriteText(open, work_file);
-    files_.Replace(work_file, open.path);
+    const auto file = files_.Open(work_file, OpenMode::Truncate);
+    file->WriteAt(0, BytesOf(content));
+    file->Sync();
+    file->Close();
+    files_.Replace(work_file, path);
   } catch (const RunTimeError&) {
     DeleteQuietly(work_file);
     throw;
   }
-}
-
-void Channels::WriteText(const Open& open, const std::string& path) {
-  const auto file = files_.Open(path, OpenMode::Truncate);
-  file->WriteAt(0, BytesOf(open.writer->Content()));
-  if (open.keeping == Keeping::Lasting) file->Sync();
-  file->Close();
 }
 
 void Channels::DeleteQuietly(const std::string& path) {

@@ -61,6 +61,12 @@ class Channels {
   template <typename Visit>
   void ForEachRecord(Channel channel, Visit visit);
 
+  /// All bytes of a file, on no channel.
+  [[nodiscard]] std::string ReadWhole(const std::string& path);
+  /// Puts these bytes in the place of a file: it holds its old ones until the new ones have reached
+  /// the disk. For changes to several records that must not be seen half done.
+  void ReplaceWhole(const std::string& path, const std::string& content);
+
   [[nodiscard]] SideFileReader& Reader(Channel channel);
   [[nodiscard]] SideFileWriter& Writer(Channel channel);
 
@@ -89,8 +95,7 @@ class Channels {
   }
   [[nodiscard]] Open& Random(Channel channel);
   [[nodiscard]] static std::uint64_t Position(const Open& open, int number);
-  void WriteOut(Open& open);
-  void WriteText(const Open& open, const std::string& path);
+  void WriteOut(const Open& open);
   void DeleteQuietly(const std::string& path);
   static void ReadRun(Open& open, int first, std::span<std::byte> into);
 

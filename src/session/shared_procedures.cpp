@@ -13,8 +13,6 @@ namespace {
 
 constexpr const char* kFileNameFile = "FileName.qz3";
 constexpr const char* kGameNameFile = "GameName.qz3";
-constexpr std::array<const char*, 6> kFirstGameNames = {"Triples", "Doubles", "Singles",
-                                                        "Tpls",    "Dbls",    "Sgls"};
 
 void Refill(LineHolder& list, const std::vector<std::string>& lines) {
   list.Clear();
@@ -29,12 +27,16 @@ void ReadGameNames(const Context& context) {
   context.session.GameNames = names;
 }
 
-void WriteFirstGameNames(const Context& context) {
-  context.channels.OpenOutput(Channel::GameNames, kGameNameFile, Keeping::Lasting);
-  for (const char* name : kFirstGameNames) {
-    context.channels.Writer(Channel::GameNames).PlainLine(name);
+/// The file itself is at fault: it is missing, or does not hold six names. A disk that fails for a
+/// moment is no reason to give up the names that are on it.
+bool NamesAreMissing(const RunTimeError& error) {
+  switch (static_cast<ErrorNumber>(error.Number())) {
+    case ErrorNumber::FileNotFound:
+    case ErrorNumber::InputPastEnd:
+      return true;
+    default:
+      return false;
   }
-  context.channels.Close(Channel::GameNames);
 }
 
 }  // namespace
@@ -58,11 +60,20 @@ void GetTeams(const Context& context, std::string_view grade, LineHolder& list) 
 void GameNames(const Context& context) {
   try {
     ReadGameNames(context);
-  } catch (const RunTimeError&) {
+  } catch (const RunTimeError& error) {
+    if (!NamesAreMissing(error)) throw;
     context.channels.AbandonAll();
-    WriteFirstGameNames(context);
+    WriteGameNames(context, {"Triples", "Doubles", "Singles", "Tpls", "Dbls", "Sgls"});
     ReadGameNames(context);
   }
+}
+
+void WriteGameNames(const Context& context, const std::array<std::string, 6>& names) {
+  context.channels.OpenOutput(Channel::GameNames, kGameNameFile, Keeping::Lasting);
+  for (const std::string& name : names) {
+    context.channels.Writer(Channel::GameNames).PlainLine(name);
+  }
+  context.channels.Close(Channel::GameNames);
 }
 
 void ReadFileName(const Context& context) {

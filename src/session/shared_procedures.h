@@ -1,5 +1,6 @@
 #pragma once
 
+#include <array>
 #include <string>
 #include <string_view>
 
@@ -18,9 +19,11 @@ void GetGrades(const Context& context, LineHolder& list);
 /// Refills a list with the distinct teams of a grade, ascending.
 void GetTeams(const Context& context, std::string_view grade, LineHolder& list);
 
-/// Reads the six strings of `GameName.qz3` into the session. A file that cannot be read is written
-/// anew with the names that every installation begins with.
+/// Reads the six strings of `GameName.qz3` into the session. A file that is missing, or holds
+/// fewer, is written anew with the names that every installation begins with.
 void GameNames(const Context& context);
+/// Writes the file, one name to a line as it stands.
+void WriteGameNames(const Context& context, const std::array<std::string, 6>& names);
 
 /// Reads the open competition's path from `FileName.qz3` in the working folder into PlayerFile.
 /// Throws when it cannot be read.

@@ -8,6 +8,9 @@
 #include "session/frmDB.h"
 #include "session/frmErrors.h"
 #include "session/frmSort.h"
+#include "setup/frmGameNames.h"
+#include "setup/frmNames.h"
+#include "setup/frmSeason.h"
 
 namespace marlowbeck {
 namespace {
@@ -24,6 +27,9 @@ void RegisterScreens(Screens& screens, const Context& context) {
   Register<frmBuend>(screens, "frmBuend", context);
   Register<frmSort>(screens, "frmSort", context);
   Register<frmAbout>(screens, "frmAbout", context);
+  Register<frmNames>(screens, "frmNames", context);
+  Register<frmGameNames>(screens, "frmGameNames", context);
+  Register<frmSeason>(screens, "frmSeason", context);
   Register<frmResults>(screens, "frmResults", context);
   Register<frmErrors>(screens, "frmErrors", context);
 }

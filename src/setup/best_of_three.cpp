@@ -1,0 +1,50 @@
+#include "setup/best_of_three.h"
+
+#include <algorithm>
+
+#include "data/records.h"
+#include "data/text.h"
+
+namespace marlowbeck {
+namespace {
+
+constexpr int kFirst = 300;
+constexpr int kSecond = 30;
+constexpr int kThird = 3;
+
+}  // namespace
+
+int CodeOf(const BestOfThreeChoice& choice) {
+  if (choice.none) return kNoGames;
+  return (choice.first ? kFirst : 0) + (choice.second ? kSecond : 0) + (choice.third ? kThird : 0);
+}
+
+BestOfThreeChoice ChoiceOf(int code) {
+  BestOfThreeChoice choice;
+  choice.none = code == kNoGames;
+  for (const int games : {0, kFirst, kSecond, kThird, kFirst + kSecond, kFirst + kThird,
+                          kSecond + kThird, kFirst + kSecond + kThird}) {
+    if (code != games) continue;
+    choice.first = games / 100 > 0;
+    choice.second = games / 10 % 10 > 0;
+    choice.third = games % 10 > 0;
+  }
+  return choice;
+}
+
+bool StampBestOfThree(std::string& player_file, std::string_view grade, int code) {
+  const std::string_view wanted = Trimmed(grade);
+  const std::span<std::byte> bytes = std::as_writable_bytes(std::span(player_file));
+  bool any = false;
+  for (std::size_t at = 0; at + kPlayerLength <= bytes.size(); at += kPlayerLength) {
+    const auto record = bytes.subspan(at, kPlayerLength);
+    if (PlayerView(record).Grade() != wanted) continue;
+    PlayerRecord player = DecodePlayer(record);
+    player.BestOfThree = code;
+    std::ranges::copy(Encode(player), record.begin());
+    any = true;
+  }
+  return any;
+}
+
+}  // namespace marlowbeck

@@ -9,6 +9,7 @@
 #include "data/channels.h"
 #include "data/real_file_system.h"
 #include "data/runtime_error.h"
+#include "support/club.h"
 
 namespace marlowbeck {
 namespace {
@@ -20,11 +21,7 @@ using Records = std::vector<ResultBytes>;
 /// A results file and its work file in a folder of their own.
 class SortPass : public ::testing::Test {
  protected:
-  SortPass() {
-    fs::create_directories(folder_);
-    files_.ChangeFolder(TextOfPath(folder_));
-  }
-  ~SortPass() override { fs::remove_all(folder_); }
+  SortPass() { files_.ChangeFolder(TextOfPath(folder_.Path())); }
 
   void Write(const std::string& name, const Records& records) {
     Channels channels(files_);
@@ -52,8 +49,7 @@ class SortPass : public ::testing::Test {
   }
 
   RealFileSystem files_;
-  fs::path folder_ = fs::temp_directory_path() /
-                     ("sort-pass-" + std::to_string(std::random_device{}()));
+  TemporaryFolder folder_;
 };
 
 ResultBytes Sheet(int id, double date) {
@@ -130,7 +126,7 @@ TEST_F(SortPass, BytesBehindTheLastWholeRecordAreDropped) {
   Write("S_A.qzr", {Sheet(1, 38000), Sheet(2, 37993)});
   files_.Open("S_A.qzr", OpenMode::ReadWrite)->WriteAt(2 * kResultLength, Bytes(Sheet(3, 1)).first(40));
   Sort();
-  EXPECT_EQ(fs::file_size(folder_ / "S_A.qzr"), 2 * kResultLength);
+  EXPECT_EQ(fs::file_size(folder_.Path() / "S_A.qzr"), 2 * kResultLength);
 }
 
 TEST_F(SortPass, DateThatIsNoNumberLosesNoRecord) {
@@ -147,7 +143,7 @@ TEST_F(SortPass, RandomSeasonsComeOutAsThePlainPassesLeaveThem) {
     Records records;
     const int count = static_cast<int>(random() % 60);
     for (int i = 0; i < count; ++i) records.push_back(Sheet(i, 37990.0 + static_cast<double>(random() % 8)));
-    fs::remove(folder_ / "S_A.qzr");
+    fs::remove(folder_.Path() / "S_A.qzr");
     Write("S_A.qzr", records);
     Sort();
     ASSERT_EQ(Read("S_A.qzr"), PlainPasses(records)) << "season " << season;

@@ -49,6 +49,8 @@ bool SideFileReader::AtEnd() const { return place_ >= content_.size(); }
 
 std::string SideFileReader::Text() { return Item(); }
 
+std::string SideFileReader::TextToFirstQuote() { return Item(Quotes::ToFirst); }
+
 double SideFileReader::Number() { return NumberOf(Item()); }
 
 Date SideFileReader::Day() {
@@ -67,7 +69,7 @@ bool SideFileReader::Truth() {
   return item == "#TRUE#";
 }
 
-std::string SideFileReader::Item() {
+std::string SideFileReader::Item(Quotes quotes) {
   if (AtEnd()) throw RunTimeError(ErrorNumber::InputPastEnd);
   place_ = content_.find_first_not_of(" \t", place_);
   if (place_ == std::string::npos) {
@@ -76,7 +78,9 @@ std::string SideFileReader::Item() {
   }
   std::string item;
   if (content_[place_] == '"') {
-    const auto end = ClosingQuote();
+    const auto end = quotes == Quotes::WholeText
+                         ? ClosingQuote()
+                         : std::min(content_.find('"', place_ + 1), content_.size());
     item = content_.substr(place_ + 1, end - place_ - 1);
     place_ = end;
     place_ = std::min(content_.find_first_of(",\r\n", place_), content_.size());

@@ -39,12 +39,15 @@ class SideFileReader {
 
   [[nodiscard]] bool AtEnd() const;
   [[nodiscard]] std::string Text();
+  /// As Text, but that a quoted text ends at the first quote there is.
+  [[nodiscard]] std::string TextToFirstQuote();
   [[nodiscard]] double Number();
   [[nodiscard]] Date Day();
   [[nodiscard]] bool Truth();
 
  private:
-  std::string Item();
+  enum class Quotes { WholeText, ToFirst };
+  std::string Item(Quotes quotes = Quotes::WholeText);
   [[nodiscard]] std::size_t ClosingQuote() const;
   void PassSeparator();
 

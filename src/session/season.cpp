@@ -20,14 +20,18 @@ std::string AskForTitle(const Context& context) {
 }  // namespace
 
 bool ReadSeason(const Context& context) {
-  context.channels.CloseAll();
+  Channels& channels = context.channels;
+  channels.CloseAll();
   try {
-    context.session.SeasonDescription = ReadOneString(context.channels, context.session.SeasonFile);
+    channels.OpenInput(Channel::Side, context.session.SeasonFile);
+    // KEPT: a title with a double quote in it comes back only up to that; a repair would read on to
+    // the quote that ends the line.
+    context.session.SeasonDescription = channels.Reader(Channel::Side).TextToFirstQuote();
   } catch (const RunTimeError&) {
-    context.channels.AbandonAll();
+    channels.AbandonAll();
     return false;
   }
-  context.channels.CloseAll();
+  channels.CloseAll();
   return true;
 }
 

@@ -100,7 +100,8 @@ TEST_F(MainMenu, FileOfNoBytesIsAValidEmptyCompetition) {
   OpenAtStart({});
   EXPECT_EQ(Caption("lblHMPlayers"), " Current File is Empty ");
   EXPECT_TRUE(Enabled("imgPlayers"));
-  for (const char* off : {"imgSheets", "imgLadder", "imgKO", "imgPrinter"}) EXPECT_FALSE(Enabled(off));
+  for (const char* off : {"imgSheets", "imgLadder", "imgKO", "imgPrinter"})
+    EXPECT_FALSE(Enabled(off));
 }
 
 TEST_F(MainMenu, OnePlayerLeavesTheKnockOutAsItStood) {
@@ -245,14 +246,13 @@ TEST_F(MainMenu, NameLeftAtThePatternCancelsNew) {
 TEST_F(MainMenu, CancellingNewAfterAgreeingToCloseBringsTheOldFileBack) {
   OpenTwoTeams();
   DoAll({"answer no", "answer yes", "file-cancel", "click mnuNew"});
-  EXPECT_EQ(BoxTexts(),
-            (std::vector<std::string>{
-                "You have 2 players in your current file:\r" + InFolder("Winter.qza") +
-                    "\rDo you want to start your new file using    \r"
-                    "the same Grades, Teams and Players ?   ",
-                "The file " + InFolder("Winter.qza") + "    \r" +
-                    "must be closed before CREATING a NEW file.    \r\r" +
-                    "Do you wish to close this file ?"}));
+  EXPECT_EQ(BoxTexts(), (std::vector<std::string>{
+                            "You have 2 players in your current file:\r" + InFolder("Winter.qza") +
+                                "\rDo you want to start your new file using    \r"
+                                "the same Grades, Teams and Players ?   ",
+                            "The file " + InFolder("Winter.qza") + "    \r" +
+                                "must be closed before CREATING a NEW file.    \r\r" +
+                                "Do you wish to close this file ?"}));
   EXPECT_EQ(OpenFile(), InFolder("Winter.qza"));
   EXPECT_EQ(Caption("lblHMPlayers"), "2 Players Listed in File. ");
   EXPECT_EQ(Title("frmDB"), "[Marlowbeck] Filename: WINTER");
@@ -375,8 +375,9 @@ TEST_F(MainMenu, ScoreSheetsWantASecondTeamInTheFirstPlayersGrade) {
             (std::vector<std::string>{"You must have at least 2 Teams in each grade    \r"
                                       "before you can enter player's scores.    "}));
   Do("click imgLadder");
-  EXPECT_EQ(BoxTexts(), (std::vector<std::string>{"You must have at least 2 Teams in your file    \r"
-                                                  "before using the Ladder.    "}));
+  EXPECT_EQ(BoxTexts(),
+            (std::vector<std::string>{"You must have at least 2 Teams in your file    \r"
+                                      "before using the Ladder.    "}));
   Do("click imgKO");
   EXPECT_EQ(BoxTexts(),
             (std::vector<std::string>{"You must have at least 2 Players for a Knock-Out.    "}));
@@ -392,8 +393,8 @@ TEST_F(MainMenu, TeamsDifferByCaseOfTheirLetters) {
 
 TEST_F(MainMenu, CommandsOfScreensThatAreNotThereOpenNothing) {
   OpenTwoTeams();
-  for (const char* command : {"click imgLadder", "click imgKO", "click imgbackup",
-                              "click mnuPlayersLists"}) {
+  for (const char* command :
+       {"click imgLadder", "click imgKO", "click imgbackup", "click mnuPlayersLists"}) {
     Do(command);
     EXPECT_TRUE(Boxes().empty()) << command;
     EXPECT_EQ(Front(), "frmDB") << command;

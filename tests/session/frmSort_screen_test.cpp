@@ -100,9 +100,7 @@ TEST(SortSweep, EachFailureLeavesOneOrderOrTheOther) {
   EXPECT_GT(SweepFailures(work), 8);
 }
 
-TEST(SortSweep, EachPowerCutLeavesOneOrderOrTheOther) {
-  EXPECT_GT(SweepPowerCuts(Sorting()), 8);
-}
+TEST(SortSweep, EachPowerCutLeavesOneOrderOrTheOther) { EXPECT_GT(SweepPowerCuts(Sorting()), 8); }
 
 }  // namespace
 }  // namespace marlowbeck

@@ -1,5 +1,5 @@
-// Every file operation of New fails once and is the last one once: afterwards the old competition is
-// open or the new one, each whole.
+// Every file operation of New fails once and is the last one once: afterwards the old competition
+// is open or the new one, each whole.
 
 #include "support/record_files.h"
 #include "support/sweep.h"

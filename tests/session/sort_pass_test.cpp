@@ -1,10 +1,10 @@
 #include "session/sort_pass.h"
 
-#include <gtest/gtest.h>
-
 #include <filesystem>
 #include <limits>
 #include <random>
+
+#include <gtest/gtest.h>
 
 #include "data/channels.h"
 #include "data/real_file_system.h"
@@ -66,7 +66,8 @@ double DateOf(const ResultBytes& record) { return ResultView(record).GameDate().
 Records PlainPasses(const Records& records) {
   const int count = static_cast<int>(records.size());
   std::vector<double> table(records.size() + 10, 0.0);
-  for (int i = 1; i <= count; ++i) table[static_cast<std::size_t>(i)] = DateOf(records[static_cast<std::size_t>(i - 1)]);
+  for (int i = 1; i <= count; ++i)
+    table[static_cast<std::size_t>(i)] = DateOf(records[static_cast<std::size_t>(i - 1)]);
   for (int gap = count / 2; gap > 0; gap /= 2) {
     for (int i = gap; i <= count - 1; ++i) {
       int j = i - gap + 1;
@@ -82,7 +83,8 @@ Records PlainPasses(const Records& records) {
   std::vector<double> distinct;
   for (int i = 1; i <= count; ++i) {
     const double next = i == count ? 0.0 : table[static_cast<std::size_t>(i + 1)];
-    if (table[static_cast<std::size_t>(i)] != next) distinct.push_back(table[static_cast<std::size_t>(i)]);
+    if (table[static_cast<std::size_t>(i)] != next)
+      distinct.push_back(table[static_cast<std::size_t>(i)]);
   }
   Records sorted;
   for (const double date : distinct) {
@@ -124,7 +126,8 @@ TEST_F(SortPass, StaleWorkFileLeavesItsSurplusRecordsInTheResults) {
 
 TEST_F(SortPass, BytesBehindTheLastWholeRecordAreDropped) {
   Write("S_A.qzr", {Sheet(1, 38000), Sheet(2, 37993)});
-  files_.Open("S_A.qzr", OpenMode::ReadWrite)->WriteAt(2 * kResultLength, Bytes(Sheet(3, 1)).first(40));
+  files_.Open("S_A.qzr", OpenMode::ReadWrite)
+      ->WriteAt(2 * kResultLength, Bytes(Sheet(3, 1)).first(40));
   Sort();
   EXPECT_EQ(fs::file_size(folder_.Path() / "S_A.qzr"), 2 * kResultLength);
 }
@@ -142,7 +145,8 @@ TEST_F(SortPass, RandomSeasonsComeOutAsThePlainPassesLeaveThem) {
   for (int season = 0; season < 200; ++season) {
     Records records;
     const int count = static_cast<int>(random() % 60);
-    for (int i = 0; i < count; ++i) records.push_back(Sheet(i, 37990.0 + static_cast<double>(random() % 8)));
+    for (int i = 0; i < count; ++i)
+      records.push_back(Sheet(i, 37990.0 + static_cast<double>(random() % 8)));
     fs::remove(folder_.Path() / "S_A.qzr");
     Write("S_A.qzr", records);
     Sort();

@@ -147,7 +147,10 @@ void Grid::SetCurrent(int row, int col) {
 
 void ProgressBar::SetRange(int min, int max) {
   Assign(min_, min);
-  Assign(max_, max);
+  Assign(max_, std::max(min, max));
+  SetValue(value_);
 }
+
+void ProgressBar::SetValue(int value) { Assign(value_, std::clamp(value, min_, max_)); }
 
 }  // namespace marlowbeck

@@ -257,7 +257,8 @@ class ProgressBar : public Control {
   [[nodiscard]] int Max() const { return max_; }
   [[nodiscard]] int Value() const { return value_; }
   void SetRange(int min, int max);
-  void SetValue(int value) { Assign(value_, value); }
+  /// Stays within the range.
+  void SetValue(int value);
 
  private:
   int min_ = 0;

@@ -104,8 +104,7 @@ void Hand::ClickWithFocus(Control& control) {
 Outcome Hand::Twice(Control& control, const std::function<Outcome()>& click) {
   const auto held = screens_.Hold(control.InScreen());
   const Outcome outcome = click();
-  if (!outcome.Done() || outcome.lost || !control.DoubleClick || !control.Live()) return outcome;
-  Whole([&] { control.Fire(control.DoubleClick); });
+  if (outcome.Done() && !outcome.lost) SecondClick(control);
   return outcome;
 }
 
@@ -113,24 +112,30 @@ Outcome Hand::DoubleClick(Control& control) {
   return Twice(control, [&] { return Click(control); });
 }
 
+Outcome Hand::SecondClick(Control& control) {
+  if (const Outcome check = CheckLive(control); !check.Done()) return check;
+  if (!control.DoubleClick) return {};
+  return Whole([&] { control.Fire(control.DoubleClick); });
+}
+
 Outcome Hand::Type(Control& control, std::string_view text) {
   if (const Outcome check = CheckLive(control); !check.Done()) return check;
   if (!CanBeTypedInto(control)) return Refused(control, "cannot be typed into");
-  return Act(control, [&] {
-    // What is typed first replaces the text that was marked; all else stands behind what the box
-    // then holds, as it does for a person.
-    AssignText(control, text.substr(0, 1));
-    const auto still_there = [&] { return control.InScreen().Focus() == &control; };
-    for (std::size_t i = 1; i < text.size() && still_there(); ++i) {
-      AssignText(control, TextOf(control) + text[i]);
-    }
-  });
+  // What is typed first replaces the text that was marked; all else stands behind what the box then
+  // holds, as it does for a person, to whom each keystroke is an event.
+  const auto held = screens_.Hold(control.InScreen());
+  const Outcome outcome = Act(control, [&] { AssignText(control, text.substr(0, 1)); });
+  const auto still_there = [&] { return control.InScreen().Focus() == &control; };
+  for (std::size_t i = 1; i < text.size() && !outcome.lost && still_there(); ++i) {
+    Retype(control, TextOf(control) + text[i]);
+  }
+  return outcome;
 }
 
 Outcome Hand::Retype(Control& control, std::string_view text) {
   if (const Outcome check = CheckLive(control); !check.Done()) return check;
   if (!CanBeTypedInto(control)) return Refused(control, "cannot be typed into");
-  return Act(control, [&] { AssignText(control, text); });
+  return Whole([&] { AssignText(control, text); });
 }
 
 /// Makes a line the current one, and the only marked one where lines are marked.
@@ -178,6 +183,24 @@ Outcome Hand::Select(Control& control, const std::vector<int>& lines) {
       list->SetIndex(line);
     }
   });
+}
+
+Outcome Hand::Toggle(Control& control, int line) {
+  if (const Outcome check = CheckLive(control); !check.Done()) return check;
+  auto* const list = As<ListBox>(control);
+  if (list == nullptr || !list->Multi()) return Refused(control, "marks one line only");
+  if (line < 0 || line >= list->Count()) return Refused(control, "has no such line");
+  return Act(control, [=] {
+    list->SetMarked(line, !list->Marked().contains(line));
+    list->SetIndex(line);
+  });
+}
+
+Outcome Hand::MoveToLine(Control& control, int line) {
+  if (const Outcome check = CheckLive(control); !check.Done()) return check;
+  auto* const list = As<LineHolder>(control);
+  if (list == nullptr) return Refused(control, "has no lines");
+  return Whole([&] { GoToLine(*list, line); });
 }
 
 Outcome Hand::ClickCell(Control& control, int row, int col) {
@@ -284,14 +307,19 @@ void Hand::PressEnter(Control* focus, Screen& front) {
 }
 
 void Hand::MoveLine(LineHolder& list, int step) {
+  const auto* box = As<ListBox>(list);
+  GoToLine(list, (box != nullptr && box->PicksOnEnter() ? box->Cursor() : list.Index()) + step);
+}
+
+void Hand::GoToLine(LineHolder& list, int line) {
+  if (list.Count() == 0) return;
+  const int target = std::clamp(line, 0, list.Count() - 1);
   if (auto* box = As<ListBox>(list); box != nullptr && box->PicksOnEnter()) {
-    box->SetCursor(std::clamp(box->Cursor() + step, 0, std::max(box->Count() - 1, 0)));
-    return;
+    box->SetCursor(target);
+  } else if (target != list.Index()) {
+    PickLine(list, target);
+    list.Fire(list.KeyUp);
   }
-  const int line = std::clamp(list.Index() + step, 0, std::max(list.Count() - 1, 0));
-  if (list.Count() == 0 || line == list.Index()) return;
-  PickLine(list, line);
-  list.Fire(list.KeyUp);
 }
 
 /// The arrow keys go from picture to picture, and from option to option, which selects it.

@@ -30,14 +30,21 @@ class Hand {
 
   Outcome Click(Control& control);
   Outcome DoubleClick(Control& control);
+  /// The second click of a double click, where the first has been told already.
+  Outcome SecondClick(Control& control);
   /// Replaces the whole text of an entry box or free combo, character by character, as typed.
   Outcome Type(Control& control, std::string_view text);
-  /// The text of an entry box or free combo has become another one by a keystroke.
+  /// The text of an entry box or free combo has become another one by a keystroke. A keystroke
+  /// moves no focus.
   Outcome Retype(Control& control, std::string_view text);
   Outcome Pick(Control& control, int line);
   Outcome PickTwice(Control& control, int line);
   /// Marks just these lines of a list, by click and control-click.
   Outcome Select(Control& control, const std::vector<int>& lines);
+  /// A control-click: marks a line of a list, or takes its mark away.
+  Outcome Toggle(Control& control, int line);
+  /// The keyboard goes to a line of a list, other than by one step up or down.
+  Outcome MoveToLine(Control& control, int line);
   Outcome ClickCell(Control& control, int row, int col);
   Outcome DoubleClickCell(Control& control, int row, int col);
   Outcome PickDate(Control& control, Date date);
@@ -59,6 +66,7 @@ class Hand {
   void PressEnter(Control* focus, Screen& front);
   static void PickLine(LineHolder& list, int line);
   void MoveLine(LineHolder& list, int step);
+  void GoToLine(LineHolder& list, int line);
   void MoveAmong(Control& focus, bool backward);
   [[nodiscard]] Control* WithMnemonic(const Screen& front, char letter) const;
 

@@ -1,0 +1,118 @@
+#include "desktop/caption_views.h"
+
+#include <QMenu>
+
+#include "desktop/encoding.h"
+
+namespace marlowbeck {
+namespace {
+
+std::optional<bool> ValueOf(const Control& control) {
+  if (const auto* check = dynamic_cast<const CheckBox*>(&control)) return check->Value();
+  if (const auto* option = dynamic_cast<const OptionButton*>(&control)) return option->Value();
+  return std::nullopt;
+}
+
+}  // namespace
+
+void PanelView::ShowKind() {
+  const std::string& caption = GetControl().Caption();
+  if (auto* const group = qobject_cast<QGroupBox*>(Widget())) {
+    group->setTitle(ToMnemonicText(caption));
+  } else {
+    Widget()->setWindowTitle(ToQt(caption));  // nowhere to be seen, but there to be read
+  }
+}
+
+/// A panel that comes up stands over those that lie in the same place.
+void PanelView::ShowCommon() {
+  const bool comes_up = GetControl().Visible() && Widget()->isHidden();
+  View::ShowCommon();
+  if (comes_up) Widget()->raise();
+}
+
+void PanelView::ReadKind(ControlState& state) const {
+  const auto* const group = qobject_cast<const QGroupBox*>(Widget());
+  state.caption =
+      group != nullptr ? FromMnemonicText(group->title()) : FromQt(Widget()->windowTitle());
+}
+
+LabelView::LabelView(Control& control, QLabel* label, Windows& windows)
+    : View(control, label, windows), label_(*label) {
+  label_.setTextFormat(Qt::PlainText);
+  if (control.Click) label_.setCursor(Qt::PointingHandCursor);
+}
+
+void LabelView::ShowKind() {
+  label_.setText(ToQt(GetControl().Caption()));
+  label_.setAccessibleName(Spoken(GetControl().Caption()));
+}
+
+void LabelView::ReadKind(ControlState& state) const { state.caption = FromQt(label_.text()); }
+
+ButtonView::ButtonView(Control& control, QAbstractButton* button, Windows& windows)
+    : View(control, button, windows), button_(*button) {
+  // The model says which option of a panel is the one.
+  button_.setAutoExclusive(false);
+  connect(button, &QAbstractButton::clicked, this,
+          [this] { Do([this](Hand& hand) { return hand.Click(GetControl()); }); });
+}
+
+void ButtonView::ShowKind() {
+  const std::string& caption = GetControl().Caption();
+  button_.setText(ToMnemonicText(caption));
+  if (!caption.empty()) button_.setAccessibleName(Spoken(caption));
+  if (const auto value = ValueOf(GetControl())) button_.setChecked(*value);
+  if (auto* const picture = qobject_cast<PictureButton*>(&button_)) {
+    picture->SetBordered(GetControl().Bordered());
+  }
+}
+
+void ButtonView::ReadKind(ControlState& state) const {
+  state.caption = FromMnemonicText(button_.text());
+  if (button_.isCheckable()) state.value = button_.isChecked();
+}
+
+MenuView::MenuView(Control& control, QAction* action, Windows& windows)
+    : View(control, nullptr, windows), action_(*action) {
+  connect(action, &QAction::triggered, this,
+          [this] { Do([this](Hand& hand) { return hand.Click(GetControl()); }); });
+}
+
+void MenuView::ShowKind() { action_.setText(ToMnemonicText(GetControl().Caption())); }
+
+void MenuView::ShowCommon() {
+  action_.setEnabled(GetControl().Enabled());
+  action_.setVisible(GetControl().Visible());
+}
+
+void MenuView::ReadKind(ControlState& state) const {
+  state.caption = FromMnemonicText(action_.text());
+}
+
+void MenuView::ReadCommon(ControlState& state) const {
+  state.visible = action_.isVisible();
+  state.shown = state.visible;
+  state.enabled = action_.isEnabled();
+  const QWidget* holder = static_cast<const QWidget*>(action_.parent());
+  if (const auto* const menu = qobject_cast<const QMenu*>(holder)) {
+    const bool is_menu_itself = menu->menuAction() == &action_;
+    state.shown = state.shown && (is_menu_itself || menu->menuAction()->isVisible());
+    state.enabled = state.enabled && menu->menuAction()->isEnabled();
+  }
+  // The window that the menu bar is on.
+  while (holder != nullptr && holder->parentWidget() != nullptr) holder = holder->parentWidget();
+  state.shown = state.shown && holder != nullptr && holder->isVisible();
+  state.enabled = state.enabled && holder != nullptr && holder->isEnabled();
+}
+
+void ProgressView::ShowKind() {
+  bar_.setRange(model_.Min(), model_.Max());
+  bar_.setValue(model_.Value());
+}
+
+void ProgressView::ReadKind(ControlState& state) const {
+  state.progress = ProgressState{bar_.minimum(), bar_.maximum(), bar_.value()};
+}
+
+}  // namespace marlowbeck

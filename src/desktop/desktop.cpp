@@ -1,0 +1,36 @@
+#include "desktop/desktop.h"
+
+#include <QApplication>
+
+namespace marlowbeck {
+
+Desktop::Desktop(const std::string& working_folder, const QString& manual)
+    : help_(manual),
+      boxes_([this] { windows_.Refresh(); }, [this](int topic) { help_.Open("qz1.HLP", topic); }),
+      dialogs_(printer_, [this] { windows_.Refresh(); }),
+      sound_(working_folder),
+      display_([this] { Refresh(); }),
+      platform_{boxes_, dialogs_, printer_, clipboard_, sound_,
+                help_,  clock_,   timer_,   display_,   *this},
+      program_(platform_, files_, working_folder),
+      windows_(program_.GetScreens(), program_.GetHand(), [] { QApplication::quit(); }),
+      filter_(windows_) {
+  qApp->installEventFilter(&filter_);
+}
+
+Desktop::~Desktop() { qApp->removeEventFilter(&filter_); }
+
+bool Desktop::Start() {
+  program_.Start();
+  windows_.Refresh();
+  return !program_.GetScreens().Ended();
+}
+
+/// In long work: what is seen is painted, but nobody can act, and the pointer says so.
+void Desktop::Refresh() {
+  windows_.ShowBusy();
+  windows_.Refresh();
+  QApplication::processEvents(QEventLoop::ExcludeUserInputEvents);
+}
+
+}  // namespace marlowbeck

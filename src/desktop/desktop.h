@@ -1,0 +1,49 @@
+#pragma once
+
+#include <memory>
+#include <string>
+
+#include "data/real_file_system.h"
+#include "desktop/dialogs.h"
+#include "desktop/help_window.h"
+#include "desktop/input_filter.h"
+#include "desktop/message_boxes.h"
+#include "desktop/page_printer.h"
+#include "desktop/services.h"
+#include "desktop/windows.h"
+#include "program/program.h"
+
+namespace marlowbeck {
+
+/// The program on a desktop: its platform, its windows, and the way in for mouse and keyboard.
+class Desktop : private Observer {
+ public:
+  /// `working_folder` is a path in code page 1252; the manual lies in `manual`.
+  Desktop(const std::string& working_folder, const QString& manual);
+  ~Desktop() override;
+
+  /// Shows the main menu. Answers false when the program has ended itself on the way.
+  bool Start();
+
+ private:
+  void Refresh();
+  void ErrorRaised(int /*number*/) override {}
+  void Ended() override {}
+
+  RealFileSystem files_;
+  HelpWindow help_;
+  MessageBoxes boxes_;
+  PagePrinter printer_;
+  DesktopDialogs dialogs_;
+  DesktopClipboard clipboard_;
+  DesktopSound sound_;
+  DesktopClock clock_;
+  DesktopTimer timer_;
+  DesktopDisplay display_;
+  Platform platform_;
+  Program program_;
+  Windows windows_;
+  InputFilter filter_;
+};
+
+}  // namespace marlowbeck

@@ -1,0 +1,61 @@
+#include "desktop/dialogs.h"
+
+#include <QApplication>
+#include <QDir>
+#include <QFileDialog>
+#include <QFontDialog>
+
+#include "desktop/encoding.h"
+#include "desktop/printer_setup.h"
+
+namespace marlowbeck {
+namespace {
+
+/// "*.qza" is a wish for a name, not one.
+bool IsPattern(const std::string& name) { return name.find_first_of("*?") != std::string::npos; }
+
+void DressFileDialog(QFileDialog& dialog, const FileDialogRequest& request) {
+  const bool open = request.mode == FileDialogRequest::Mode::Open;
+  dialog.setWindowTitle(ToQt(request.title));
+  dialog.setDirectory(ToQt(request.folder));
+  dialog.setNameFilter(ToQt(request.filter));
+  dialog.setDefaultSuffix(ToQt(request.extension));
+  dialog.setAcceptMode(open ? QFileDialog::AcceptOpen : QFileDialog::AcceptSave);
+  dialog.setFileMode(open ? QFileDialog::ExistingFile : QFileDialog::AnyFile);
+  // The program asks in its own words about a file that is there already.
+  dialog.setOptions(QFileDialog::DontUseNativeDialog | QFileDialog::DontConfirmOverwrite |
+                    QFileDialog::HideNameFilterDetails);
+  if (!request.name.empty() && !IsPattern(request.name)) dialog.selectFile(ToQt(request.name));
+}
+
+}  // namespace
+
+std::optional<std::string> DesktopDialogs::File(const FileDialogRequest& request) {
+  before_();
+  QFileDialog dialog(QApplication::activeWindow());
+  DressFileDialog(dialog, request);
+  if (dialog.exec() != QDialog::Accepted || dialog.selectedFiles().isEmpty()) return std::nullopt;
+  return FromQt(QDir::toNativeSeparators(dialog.selectedFiles().constFirst()));
+}
+
+std::optional<FontChoice> DesktopDialogs::Font(const FontChoice& present) {
+  before_();
+  QFont font(ToQt(present.name), std::max(present.size, 1));
+  font.setBold(present.bold);
+  font.setItalic(present.italic);
+  QFontDialog dialog(font, QApplication::activeWindow());
+  dialog.setOption(QFontDialog::DontUseNativeDialog);
+  if (dialog.exec() != QDialog::Accepted) return std::nullopt;
+  const QFont chosen = dialog.selectedFont();
+  return FontChoice{FromQt(chosen.family()), chosen.pointSize(), chosen.bold(), chosen.italic()};
+}
+
+std::optional<Orientation> DesktopDialogs::PrinterSetup(Orientation present) {
+  before_();
+  PrinterSetupDialog dialog(printer_.Target(), present, QApplication::activeWindow());
+  if (dialog.exec() != QDialog::Accepted) return std::nullopt;
+  printer_.SetTarget(dialog.ChosenTarget());
+  return dialog.ChosenOrientation();
+}
+
+}  // namespace marlowbeck

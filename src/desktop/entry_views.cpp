@@ -1,0 +1,121 @@
+#include "desktop/entry_views.h"
+
+#include <QAbstractItemView>
+
+#include "desktop/encoding.h"
+
+namespace marlowbeck {
+
+CaptionedView::CaptionedView(Control& control, QWidget* widget, Windows& windows)
+    : View(control, widget, windows),
+      buddy_(widget->window()->findChild<QLabel*>("buddy_" + ObjectNameOf(control))) {
+  if (buddy_ != nullptr) buddy_->setBuddy(widget);
+}
+
+void CaptionedView::ShowCommon() {
+  View::ShowCommon();
+  Widget()->setAccessibleName(Spoken(GetControl().Caption()));
+  if (buddy_ == nullptr) return;
+  buddy_->setText(ToMnemonicText(GetControl().Caption()));
+  buddy_->setEnabled(GetControl().Enabled());
+  buddy_->setVisible(GetControl().Visible());
+}
+
+TextView::TextView(TextBox& control, QLineEdit* box, Windows& windows)
+    : CaptionedView(control, box, windows), model_(control), box_(*box) {
+  box_.setAcceptDrops(false);
+  connect(box, &QLineEdit::textEdited, this, [this](const QString& text) {
+    Do([&](Hand& hand) { return hand.Retype(model_, FromQt(text)); });
+  });
+}
+
+void TextView::ShowKind() {
+  box_.setReadOnly(model_.Locked());
+  if (FromQt(box_.text()) != model_.Text()) box_.setText(ToQt(model_.Text()));
+}
+
+void TextView::ReadKind(ControlState& state) const {
+  state.text = FromQt(box_.text());
+  state.locked = box_.isReadOnly();
+}
+
+ComboView::ComboView(ComboBox& control, QComboBox* box, Windows& windows)
+    : CaptionedView(control, box, windows), model_(control), box_(*box) {
+  box_.setInsertPolicy(QComboBox::NoInsert);
+  box_.setMaxVisibleItems(20);
+  connect(box, &QComboBox::activated, this,
+          [this](int line) { Do([=, this](Hand& hand) { return hand.Pick(model_, line); }); });
+}
+
+QWidget* ComboView::FocusWidget() const {
+  return box_.isEditable() ? static_cast<QWidget*>(box_.lineEdit()) : &box_;
+}
+
+void ComboView::FocusCame() {
+  if (box_.isEditable()) box_.lineEdit()->selectAll();
+}
+
+void ComboView::ShowEditable() {
+  if (box_.isEditable() == !model_.Locked()) return;
+  box_.setEditable(!model_.Locked());
+  if (!box_.isEditable()) return;
+  box_.setCompleter(nullptr);
+  box_.lineEdit()->setFocusPolicy(Qt::TabFocus);
+  box_.lineEdit()->setAcceptDrops(false);
+  connect(box_.lineEdit(), &QLineEdit::textEdited, this, [this](const QString& text) {
+    Do([&](Hand& hand) { return hand.Retype(model_, FromQt(text)); });
+  });
+}
+
+void ComboView::ShowLines() {
+  const auto& lines = model_.Lines();
+  bool same = box_.count() == model_.Count();
+  for (int i = 0; same && i < model_.Count(); ++i) {
+    same = FromQt(box_.itemText(i)) == lines[static_cast<std::size_t>(i)];
+  }
+  if (same) return;
+  box_.clear();
+  for (const std::string& line : lines) box_.addItem(ToQt(line));
+}
+
+/// A locked combo may hold a text that is none of its lines; it stands where nothing is picked.
+void ComboView::ShowKind() {
+  ShowEditable();
+  ShowLines();
+  if (box_.currentIndex() != model_.Index()) box_.setCurrentIndex(model_.Index());
+  if (!box_.isEditable()) {
+    box_.setPlaceholderText(ToQt(model_.Text()));
+  } else if (FromQt(box_.currentText()) != model_.Text()) {
+    box_.setEditText(ToQt(model_.Text()));
+  }
+}
+
+void ComboView::ReadKind(ControlState& state) const {
+  auto& lines = state.lines.emplace();
+  for (int i = 0; i < box_.count(); ++i) lines.push_back(FromQt(box_.itemText(i)));
+  state.index = box_.currentIndex();
+  const bool placeholder = !box_.isEditable() && box_.currentIndex() < 0;
+  state.text = FromQt(placeholder ? box_.placeholderText() : box_.currentText());
+  state.locked = !box_.isEditable();
+}
+
+DateView::DateView(DatePicker& control, QDateEdit* box, Windows& windows)
+    : CaptionedView(control, box, windows), model_(control), box_(*box) {
+  box_.setDisplayFormat("dd/MM/yyyy");
+  box_.setCalendarPopup(true);
+  box_.setDateRange(QDate(100, 1, 1), QDate(9999, 12, 31));
+  box_.setKeyboardTracking(false);
+  box_.setAcceptDrops(false);
+  connect(box, &QDateEdit::userDateChanged, this, [this](QDate date) {
+    Do([=, this](Hand& hand) { return hand.PickDate(model_, FromQt(date)); });
+  });
+}
+
+void DateView::ShowKind() {
+  const QDate date = ToQt(model_.Value());
+  if (box_.date() != date) box_.setDate(date);
+}
+
+void DateView::ReadKind(ControlState& state) const { state.date = FromQt(box_.date()); }
+
+}  // namespace marlowbeck

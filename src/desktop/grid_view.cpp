@@ -1,0 +1,182 @@
+#include "desktop/grid_view.h"
+
+#include <QHeaderView>
+#include <QPainter>
+#include <QScrollBar>
+#include <QStyledItemDelegate>
+
+#include "desktop/encoding.h"
+
+namespace marlowbeck {
+namespace {
+
+/// The column that is current while the heading row is.
+constexpr const char* kHeadingColumn = "headingColumn";
+
+/// Rules between rows only.
+class RuledDelegate : public QStyledItemDelegate {
+ public:
+  using QStyledItemDelegate::QStyledItemDelegate;
+  void paint(QPainter* painter, const QStyleOptionViewItem& option,
+             const QModelIndex& index) const override {
+    QStyledItemDelegate::paint(painter, option, index);
+    painter->setPen(option.palette.color(QPalette::Disabled, QPalette::Highlight));
+    painter->drawLine(option.rect.bottomLeft(), option.rect.bottomRight());
+  }
+};
+
+std::vector<std::vector<std::string>> CellsOf(const Grid& grid) {
+  std::vector<std::vector<std::string>> cells(static_cast<std::size_t>(grid.Rows()));
+  for (int row = 0; row < grid.Rows(); ++row) {
+    for (int col = 0; col < grid.Cols(); ++col) {
+      cells[static_cast<std::size_t>(row)].push_back(grid.Cell(row, col));
+    }
+  }
+  return cells;
+}
+
+template <typename Item>
+std::string TextOf(const Item* item) {
+  return item == nullptr ? std::string() : FromQt(item->text());
+}
+
+}  // namespace
+
+GridView::GridView(Grid& control, QTableWidget* table, Windows& windows)
+    : CaptionedView(control, table, windows), model_(control), table_(*table) {
+  table_.setItemDelegate(new RuledDelegate(table));
+  table_.setShowGrid(false);
+  table_.setAlternatingRowColors(true);
+  table_.setEditTriggers(QAbstractItemView::NoEditTriggers);
+  table_.setSelectionBehavior(QAbstractItemView::SelectRows);
+  table_.setSelectionMode(QAbstractItemView::SingleSelection);
+  table_.setHorizontalScrollMode(QAbstractItemView::ScrollPerPixel);
+  table_.verticalHeader()->hide();
+  table_.verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
+  table_.verticalHeader()->setDefaultSectionSize(26);
+  table_.horizontalHeader()->setHighlightSections(false);
+  table_.horizontalHeader()->setFocusPolicy(Qt::NoFocus);
+}
+
+Qt::Alignment GridView::AlignmentOf(int col) const {
+  return Qt::AlignVCenter | (col >= model_.FiguresFrom() ? Qt::AlignRight : Qt::AlignLeft);
+}
+
+void GridView::ShowKind() {
+  auto cells = CellsOf(model_);
+  const bool same = cells == shown_cells_ && table_.columnCount() == model_.Cols() &&
+                    shown_figures_from_ == model_.FiguresFrom();
+  if (!same) {
+    shown_cells_ = std::move(cells);
+    shown_figures_from_ = model_.FiguresFrom();
+    ShowHeading();
+    ShowCells();
+    table_.resizeColumnsToContents();
+  }
+  ShowCurrent();
+}
+
+void GridView::ShowHeading() {
+  table_.setColumnCount(model_.Cols());
+  table_.horizontalHeader()->setHidden(model_.Rows() == 0);
+  for (int col = 0; col < model_.Cols(); ++col) {
+    auto* const item = new QTableWidgetItem(ToQt(model_.Cell(0, col)));
+    item->setTextAlignment(AlignmentOf(col));
+    table_.setHorizontalHeaderItem(col, item);
+  }
+}
+
+void GridView::ShowCells() {
+  table_.setRowCount(std::max(model_.Rows() - 1, 0));
+  for (int row = 1; row < model_.Rows(); ++row) {
+    for (int col = 0; col < model_.Cols(); ++col) {
+      auto* const item = new QTableWidgetItem(ToQt(model_.Cell(row, col)));
+      item->setTextAlignment(AlignmentOf(col));
+      table_.setItem(row - 1, col, item);
+    }
+  }
+}
+
+void GridView::ShowCurrent() {
+  table_.setProperty(kHeadingColumn, model_.Col());
+  if (model_.Row() == 0) {
+    table_.setCurrentCell(-1, -1);
+    table_.clearSelection();
+  } else {
+    table_.setCurrentCell(model_.Row() - 1, model_.Col());
+  }
+}
+
+void GridView::ReadKind(ControlState& state) const {
+  auto& cells = state.cells.emplace();
+  const int cols = table_.columnCount();
+  if (!table_.horizontalHeader()->isHidden()) {
+    auto& heading = cells.emplace_back();
+    for (int col = 0; col < cols; ++col) {
+      heading.push_back(TextOf(table_.horizontalHeaderItem(col)));
+    }
+  }
+  for (int row = 0; row < table_.rowCount(); ++row) {
+    auto& line = cells.emplace_back();
+    for (int col = 0; col < cols; ++col) line.push_back(TextOf(table_.item(row, col)));
+  }
+  state.cols = cols;
+  state.row = table_.currentRow() + 1;
+  state.col =
+      table_.currentRow() < 0 ? table_.property(kHeadingColumn).toInt() : table_.currentColumn();
+}
+
+bool GridView::Pressed(const QWidget& on, const QMouseEvent& event) {
+  const QPoint place = event.position().toPoint();
+  if (&on == table_.viewport()) {
+    const QModelIndex index = table_.indexAt(place);
+    if (index.isValid()) PressCell(index.row() + 1, index.column());
+    return true;
+  }
+  const auto& header = *table_.horizontalHeader();
+  if (&on != header.viewport() || header.cursor().shape() == Qt::SplitHCursor) return false;
+  const int col = header.logicalIndexAt(place);
+  if (col >= 0) PressCell(0, col);
+  return true;
+}
+
+void GridView::PressCell(int row, int col) {
+  Do([=, this](Hand& hand) { return hand.ClickCell(model_, row, col); });
+}
+
+/// The keys scroll; the current cell is the pointer's.
+bool GridView::Typed(const QKeyEvent& event) {
+  QScrollBar& down = *table_.verticalScrollBar();
+  QScrollBar& across = *table_.horizontalScrollBar();
+  switch (event.key()) {
+    case Qt::Key_Up:
+      down.triggerAction(QAbstractSlider::SliderSingleStepSub);
+      break;
+    case Qt::Key_Down:
+      down.triggerAction(QAbstractSlider::SliderSingleStepAdd);
+      break;
+    case Qt::Key_PageUp:
+      down.triggerAction(QAbstractSlider::SliderPageStepSub);
+      break;
+    case Qt::Key_PageDown:
+      down.triggerAction(QAbstractSlider::SliderPageStepAdd);
+      break;
+    case Qt::Key_Home:
+      down.triggerAction(QAbstractSlider::SliderToMinimum);
+      break;
+    case Qt::Key_End:
+      down.triggerAction(QAbstractSlider::SliderToMaximum);
+      break;
+    case Qt::Key_Left:
+      across.triggerAction(QAbstractSlider::SliderSingleStepSub);
+      break;
+    case Qt::Key_Right:
+      across.triggerAction(QAbstractSlider::SliderSingleStepAdd);
+      break;
+    default:
+      break;
+  }
+  return true;
+}
+
+}  // namespace marlowbeck

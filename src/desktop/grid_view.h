@@ -1,0 +1,35 @@
+#pragma once
+
+#include <QTableWidget>
+
+#include "desktop/entry_views.h"
+#include "ui/controls.h"
+
+namespace marlowbeck {
+
+/// A grid: its heading row is a header that stays, names stand left and figures right.
+class GridView : public CaptionedView {
+ public:
+  GridView(Grid& control, QTableWidget* table, Windows& windows);
+  bool Pressed(const QWidget& on, const QMouseEvent& event) override;
+  bool Typed(const QKeyEvent& event) override;
+  [[nodiscard]] bool KeepsArrows() const override { return true; }
+
+ protected:
+  void ShowKind() override;
+  void ReadKind(ControlState& state) const override;
+
+ private:
+  void ShowCells();
+  void ShowHeading();
+  void ShowCurrent();
+  void PressCell(int row, int col);
+  [[nodiscard]] Qt::Alignment AlignmentOf(int col) const;
+
+  Grid& model_;
+  QTableWidget& table_;
+  std::vector<std::vector<std::string>> shown_cells_;
+  int shown_figures_from_ = -1;
+};
+
+}  // namespace marlowbeck

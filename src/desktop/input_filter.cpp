@@ -1,0 +1,223 @@
+#include "desktop/input_filter.h"
+
+#include <QAbstractScrollArea>
+#include <QApplication>
+#include <QComboBox>
+#include <QDateEdit>
+#include <QMainWindow>
+#include <QMenuBar>
+
+#include "desktop/caption_views.h"
+#include "desktop/encoding.h"
+
+namespace marlowbeck {
+namespace {
+
+/// The letter or figure pressed together with Alt; 0 for none.
+char AltLetter(const QKeyEvent& event) {
+  if (event.modifiers() != Qt::AltModifier) return 0;
+  const int key = event.key();
+  const bool letter =
+      (key >= Qt::Key_A && key <= Qt::Key_Z) || (key >= Qt::Key_0 && key <= Qt::Key_9);
+  return letter ? static_cast<char>(key) : '\0';
+}
+
+/// Labels and panels that answer to a click of their own.
+bool IsClickable(const Control& control) {
+  return (control.GetKind() == Kind::Label || control.GetKind() == Kind::Panel) && control.Click;
+}
+
+/// Lets the menu of a menu bar drop down, as its letter does.
+void DropDown(ScreenWindow& window, const Control& menu) {
+  auto* const frame = qobject_cast<QMainWindow*>(&window.Window());
+  const auto* const view = static_cast<const MenuView*>(window.ViewOf(menu));
+  if (frame != nullptr && view != nullptr) frame->menuBar()->setActiveAction(&view->GetAction());
+}
+
+bool IsMenuMnemonic(const Control& control, char letter) {
+  return control.GetKind() == Kind::Menu && control.InControl() == nullptr && control.Live() &&
+         MnemonicOf(control.Caption()) == letter;
+}
+
+}  // namespace
+
+std::optional<Key> HandKeyOf(const QKeyEvent& event) {
+  const auto modifiers = event.modifiers() & ~Qt::KeypadModifier;
+  if (event.key() == Qt::Key_Backtab) return Key::BackTab;
+  if (event.key() == Qt::Key_Tab && modifiers == Qt::ShiftModifier) return Key::BackTab;
+  if (modifiers != Qt::NoModifier) return std::nullopt;
+  switch (event.key()) {
+    case Qt::Key_Return:
+    case Qt::Key_Enter:
+      return Key::Enter;
+    case Qt::Key_Tab:
+      return Key::Tab;
+    case Qt::Key_Escape:
+      return Key::Escape;
+    case Qt::Key_Up:
+      return Key::Up;
+    case Qt::Key_Down:
+      return Key::Down;
+    case Qt::Key_F1:
+      return Key::F1;
+    default:
+      return std::nullopt;
+  }
+}
+
+bool InputFilter::eventFilter(QObject* watched, QEvent* event) {
+  switch (event->type()) {
+    case QEvent::KeyPress:
+    case QEvent::ShortcutOverride:
+    case QEvent::MouseButtonPress:
+    case QEvent::MouseButtonDblClick:
+    case QEvent::MouseButtonRelease:
+    case QEvent::MouseMove:
+    case QEvent::Wheel:
+    case QEvent::Close:
+      break;
+    default:
+      return false;
+  }
+  ScreenWindow* const window = windows_.WindowOf(watched);
+  if (window == nullptr) return false;
+  switch (event->type()) {
+    case QEvent::KeyPress:
+    case QEvent::ShortcutOverride:
+      return Key(*watched, *window, *static_cast<QKeyEvent*>(event));
+    case QEvent::MouseButtonPress:
+      return MousePress(*watched, *window, *static_cast<QMouseEvent*>(event));
+    case QEvent::MouseButtonDblClick:
+      return SecondPress(*watched, *window, *static_cast<QMouseEvent*>(event));
+    case QEvent::MouseButtonRelease:
+      return MouseRelease(*watched, *window, *static_cast<QMouseEvent*>(event));
+    case QEvent::MouseMove:
+      return MouseMove(*watched, *window, *static_cast<QMouseEvent*>(event));
+    case QEvent::Wheel:
+      // A wheel that passes over an entry changes nothing in it.
+      return qobject_cast<QComboBox*>(watched) != nullptr ||
+             qobject_cast<QDateEdit*>(watched) != nullptr;
+    default:
+      if (watched != &window->Window()) return false;
+      event->ignore();
+      windows_.Do(nullptr, [&](Hand& hand) { return hand.CloseScreen(window->GetScreen()); });
+      return true;
+  }
+}
+
+/// Of a key that is ours the shortcut is claimed first, so that it comes as a key.
+bool InputFilter::Key(const QObject& watched, ScreenWindow& window, QKeyEvent& event) {
+  if (qobject_cast<const QMenuBar*>(&watched) != nullptr) return false;
+  View* const view = window.ViewAt(&watched);
+  const bool arrows = event.key() == Qt::Key_Up || event.key() == Qt::Key_Down;
+  const bool common =
+      AltLetter(event) != 0 ||
+      (HandKeyOf(event).has_value() && !(arrows && view != nullptr && view->KeepsArrows()));
+  if (event.type() == QEvent::ShortcutOverride) {
+    if (common) event.accept();
+    return common;
+  }
+  if (common) return CommonKey(event, view);
+  const auto held = event.modifiers() & ~(Qt::ShiftModifier | Qt::KeypadModifier);
+  return view != nullptr && held == Qt::NoModifier && view->Typed(event);
+}
+
+bool InputFilter::CommonKey(const QKeyEvent& event, const View* view) {
+  const auto key = HandKeyOf(event);
+  // A key that is held down is not pressed again.
+  const bool repeats = key != Key::Up && key != Key::Down && key != Key::Tab && key != Key::BackTab;
+  if (event.isAutoRepeat() && repeats) return true;
+  if (view != nullptr) FinishTyping();
+  if (key) {
+    windows_.DoByKey([&](Hand& hand) { return hand.Press(*key); });
+    return true;
+  }
+  const char letter = AltLetter(event);
+  windows_.DoByKey([&](Hand& hand) { return hand.PressMnemonic(letter); });
+  if (ScreenWindow* const front = windows_.Front()) {
+    for (const Control* control : front->GetScreen().Controls()) {
+      if (!IsMenuMnemonic(*control, letter)) continue;
+      DropDown(*front, *control);
+      break;
+    }
+  }
+  return true;
+}
+
+bool InputFilter::TakeFocus(Control& control) {
+  if (!control.TakesFocus() || windows_.GetScreens().Focus() == &control) return true;
+  return !windows_.Do(nullptr, [&](Hand& hand) { return hand.Focus(control); }).lost;
+}
+
+/// A date that is half typed is told before the person goes on to something else.
+void InputFilter::FinishTyping() {
+  const Control* const focus = windows_.GetScreens().Focus();
+  ScreenWindow* const front = windows_.Front();
+  if (focus == nullptr || front == nullptr) return;
+  if (View* const view = front->ViewOf(*focus)) view->FinishTyping();
+}
+
+bool InputFilter::MousePress(QObject& watched, ScreenWindow& window, const QMouseEvent& event) {
+  swallowing_ = false;
+  pressed_ = nullptr;
+  View* const view = window.ViewAt(&watched);
+  if (view == nullptr) return false;
+  if (!view->Widget()->isEnabled()) return true;
+  Control& control = view->GetControl();
+  if (windows_.GetScreens().Focus() != &control) FinishTyping();
+  if (!TakeFocus(control)) {
+    swallowing_ = true;
+    return true;
+  }
+  if (event.button() != Qt::LeftButton) return false;
+  pressed_ = &control;
+  const auto* const widget = static_cast<const QWidget*>(&watched);
+  return view->Pressed(*widget, event) || IsClickable(control);
+}
+
+bool InputFilter::SecondPress(QObject& watched, ScreenWindow& window, const QMouseEvent& event) {
+  View* const view = window.ViewAt(&watched);
+  if (view == nullptr || !view->GetControl().DoubleClick) {
+    return MousePress(watched, window, event);
+  }
+  if (event.button() != Qt::LeftButton || swallowing_) return true;
+  Control& control = view->GetControl();
+  windows_.Do(view, [&](Hand& hand) { return hand.SecondClick(control); });
+  return true;
+}
+
+bool InputFilter::MouseRelease(const QObject& watched, ScreenWindow& window,
+                               const QMouseEvent& event) {
+  if (swallowing_) {
+    swallowing_ = event.buttons() != Qt::NoButton;
+    return true;
+  }
+  View* const view = window.ViewAt(&watched);
+  if (view == nullptr || event.button() != Qt::LeftButton) return false;
+  Control& control = view->GetControl();
+  const bool inside = view->Widget()->rect().contains(event.position().toPoint());
+  if (!IsClickable(control) || pressed_ != &control || !inside) return false;
+  pressed_ = nullptr;
+  windows_.Do(view, [&](Hand& hand) { return hand.Click(control); });
+  return true;
+}
+
+bool InputFilter::MouseMove(const QObject& watched, ScreenWindow& window,
+                            const QMouseEvent& event) {
+  if (event.buttons() != Qt::NoButton) return swallowing_;
+  if (qobject_cast<const QMenuBar*>(&watched) != nullptr) return false;
+  const View* const view = window.ViewAt(&watched);
+  if (view == nullptr) {
+    windows_.Do(nullptr, [&](Hand& hand) { return hand.HoverScreen(window.GetScreen()); });
+    return true;
+  }
+  // Lists and grids need the pointer themselves, for the tips and edges of their headers.
+  if (dynamic_cast<const QAbstractScrollArea*>(view->Widget()) != nullptr) return false;
+  Control& control = view->GetControl();
+  if (control.MouseMove) {
+    windows_.Do(nullptr, [&](Hand& hand) { return hand.Hover(control); });
+  }
+  return true;
+}
+
+}  // namespace marlowbeck

@@ -1,0 +1,140 @@
+#include "desktop/list_view.h"
+
+#include <QScrollBar>
+
+#include "desktop/encoding.h"
+
+namespace marlowbeck {
+
+ListView::ListView(ListBox& control, QListWidget* list, Windows& windows)
+    : CaptionedView(control, list, windows), model_(control), list_(*list) {
+  list_.setSelectionMode(model_.Multi() ? QAbstractItemView::MultiSelection
+                                        : QAbstractItemView::SingleSelection);
+  list_.setUniformItemSizes(true);
+  list_.setEditTriggers(QAbstractItemView::NoEditTriggers);
+}
+
+void ListView::ShowKind() {
+  ShowLines();
+  ShowMarks();
+  const int line = CurrentLine();
+  if (line >= 0 && line != shown_line_) list_.scrollToItem(list_.item(line));
+  shown_line_ = line;
+  list_.setAccessibleDescription(model_.GetKind() == Kind::Folders ||
+                                         model_.GetKind() == Kind::Files
+                                     ? ToQt(static_cast<const DiskList&>(model_).Path())
+                                     : QString());
+}
+
+void ListView::ShowLines() {
+  if (shown_lines_ == model_.Lines()) return;
+  shown_lines_ = model_.Lines();
+  const int scrolled = list_.verticalScrollBar()->value();
+  list_.clear();
+  QStringList texts;
+  for (const std::string& line : shown_lines_) texts.append(ToQt(line));
+  list_.addItems(texts);
+  list_.verticalScrollBar()->setValue(scrolled);
+  shown_line_ = -1;
+}
+
+void ListView::ShowMarks() {
+  auto& selection = *list_.selectionModel();
+  const auto* const items = list_.model();
+  selection.clearSelection();
+  selection.setCurrentIndex(CurrentLine() < 0 ? QModelIndex() : items->index(CurrentLine(), 0),
+                            QItemSelectionModel::NoUpdate);
+  const auto mark = [&](int line) {
+    selection.select(items->index(line, 0), QItemSelectionModel::Select);
+  };
+  if (model_.Multi()) {
+    for (const int line : model_.Marked()) mark(line);
+  } else if (model_.Index() >= 0) {
+    mark(model_.Index());
+  }
+}
+
+int ListView::CurrentLine() const {
+  return model_.PicksOnEnter() ? model_.Cursor() : model_.Index();
+}
+
+void ListView::ReadKind(ControlState& state) const {
+  auto& lines = state.lines.emplace();
+  for (int i = 0; i < list_.count(); ++i) lines.push_back(FromQt(list_.item(i)->text()));
+  std::vector<int> selected;
+  for (const QModelIndex& index : list_.selectionModel()->selectedIndexes()) {
+    selected.push_back(index.row());
+  }
+  std::sort(selected.begin(), selected.end());
+  if (list_.selectionMode() == QAbstractItemView::SingleSelection) {
+    state.index = selected.empty() ? -1 : selected.front();
+  } else {
+    state.index = list_.currentRow();
+    state.selected = selected;
+  }
+  if (state.kind == Kind::Folders || state.kind == Kind::Files) {
+    state.path = FromQt(list_.accessibleDescription());
+  }
+}
+
+/// A press beside the lines only brings the focus.
+bool ListView::Pressed(const QWidget& on, const QMouseEvent& event) {
+  if (&on != list_.viewport()) return false;
+  const QModelIndex index = list_.indexAt(event.position().toPoint());
+  if (index.isValid()) PressLine(index.row(), event.modifiers());
+  return true;
+}
+
+void ListView::PressLine(int line, Qt::KeyboardModifiers modifiers) {
+  if (model_.Multi() && modifiers.testFlag(Qt::ControlModifier)) {
+    Do([=, this](Hand& hand) { return hand.Toggle(model_, line); });
+  } else if (model_.Multi() && modifiers.testFlag(Qt::ShiftModifier) && model_.Index() >= 0) {
+    std::vector<int> lines;
+    const int step = line < model_.Index() ? -1 : 1;
+    for (int i = model_.Index(); i != line; i += step) lines.push_back(i);
+    lines.push_back(line);
+    Do([&](Hand& hand) { return hand.Select(model_, lines); });
+  } else {
+    Do([=, this](Hand& hand) { return hand.Pick(model_, line); });
+  }
+}
+
+bool ListView::Typed(const QKeyEvent& event) {
+  if (event.key() == Qt::Key_Space && CurrentLine() >= 0) {
+    PressLine(CurrentLine(), model_.Multi() ? Qt::ControlModifier : Qt::NoModifier);
+    return true;
+  }
+  const int line = LineFor(event);
+  if (line >= 0) Do([=, this](Hand& hand) { return hand.MoveToLine(model_, line); });
+  return true;
+}
+
+/// The line that a key goes to; -1 when it goes nowhere.
+int ListView::LineFor(const QKeyEvent& event) const {
+  const int page = std::max(1, list_.viewport()->height() / std::max(1, list_.sizeHintForRow(0)));
+  switch (event.key()) {
+    case Qt::Key_Home:
+      return 0;
+    case Qt::Key_End:
+      return model_.Count() - 1;
+    case Qt::Key_PageUp:
+      return std::max(CurrentLine() - page, 0);
+    case Qt::Key_PageDown:
+      return CurrentLine() + page;
+    default:
+      return LineStartingWith(event.text());
+  }
+}
+
+/// The next line, round the end, that begins with a letter.
+int ListView::LineStartingWith(const QString& text) const {
+  if (text.isEmpty() || !text[0].isLetterOrNumber()) return -1;
+  const int count = list_.count();
+  for (int step = 1; step <= count; ++step) {
+    const int line = (std::max(CurrentLine(), -1) + step) % count;
+    if (list_.item(line)->text().trimmed().startsWith(text, Qt::CaseInsensitive)) return line;
+  }
+  return -1;
+}
+
+}  // namespace marlowbeck

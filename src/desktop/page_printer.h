@@ -1,0 +1,71 @@
+#pragma once
+
+#include <string>
+#include <variant>
+#include <vector>
+
+#include <QFont>
+#include <QPagedPaintDevice>
+#include <QString>
+
+#include "platform/printer.h"
+
+namespace marlowbeck {
+
+/// Where documents go.
+struct PrintTarget {
+  enum class Kind { Printer, Pdf, Preview };
+  Kind kind = Kind::Pdf;
+  QString printer;  ///< its name, where it is one
+};
+
+/// Documents are kept operation by operation, in twips, and painted as a whole when they end: on a
+/// printer, into a PDF file that opens in the viewer, or into a preview. The paper is A4.
+class PagePrinter : public Printer {
+ public:
+  std::string DeviceName() override;
+  Orientation GetOrientation() override { return orientation_; }
+  void SetOrientation(Orientation orientation) override { orientation_ = orientation; }
+  int PageWidth() override;
+  int PageHeight() override;
+
+  void SetFont(const PrinterFont& font) override { font_ = font; }
+  PrinterFont GetFont() override { return font_; }
+  double TextWidth(const std::string& text) override;
+  double TextHeight(const std::string& text) override;
+
+  void Print(double x, double y, const std::string& text) override;
+  void Line(double x1, double y1, double x2, double y2) override;
+  void Box(double x1, double y1, double x2, double y2) override;
+  void NewPage() override { pages_.emplace_back(); }
+  void EndDoc() override;
+  void KillDoc() override { pages_.assign(1, {}); }
+
+  [[nodiscard]] const PrintTarget& Target();
+  void SetTarget(const PrintTarget& target);
+
+ private:
+  struct TextAt {
+    QPointF place;
+    QString text;
+    PrinterFont font;
+  };
+  using Operation = std::variant<TextAt, QLineF, QRectF>;
+  using Pages = std::vector<std::vector<Operation>>;
+
+  static void Perform(QPainter& painter, const Operation& operation);
+  static void Paint(QPagedPaintDevice& device, const Pages& pages);
+  void SetLayout(QPagedPaintDevice& device) const;
+  void Send(const Pages& pages);
+  void SendToPrinter(const Pages& pages);
+  void SendToPdf(const Pages& pages);
+  void SendToPreview(const Pages& pages);
+
+  PrinterFont font_;
+  Orientation orientation_ = Orientation::Portrait;
+  Pages pages_ = Pages(1);
+  PrintTarget target_;
+  bool target_known_ = false;
+};
+
+}  // namespace marlowbeck

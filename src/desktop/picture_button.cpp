@@ -1,0 +1,74 @@
+#include "desktop/picture_button.h"
+
+#include <QPainter>
+
+namespace marlowbeck {
+namespace {
+
+constexpr int kMargin = 6;  ///< room for the frame, in pixels
+constexpr double kFrameWidth = 3;
+constexpr double kRadius = 8;
+constexpr double kFaded = 0.35;
+
+}  // namespace
+
+PictureButton::PictureButton(QWidget* parent) : QAbstractButton(parent) {
+  QSizePolicy policy(QSizePolicy::Expanding, QSizePolicy::Expanding);
+  setSizePolicy(policy);
+}
+
+void PictureButton::setIcon(const QString& name) {
+  icon_name_ = name;
+  picture_.load(":/icons/" + name + ".svg");
+  updateGeometry();
+  update();
+}
+
+void PictureButton::SetBordered(bool bordered) {
+  if (bordered_ == bordered) return;
+  bordered_ = bordered;
+  update();
+}
+
+QSize PictureButton::sizeHint() const {
+  return picture_.defaultSize() + QSize(2 * kMargin, 2 * kMargin);
+}
+
+QSize PictureButton::minimumSizeHint() const { return sizeHint() / 2; }
+
+QRectF PictureButton::PictureArea() const {
+  const QRectF room = QRectF(rect()).adjusted(kMargin, kMargin, -kMargin, -kMargin);
+  QSizeF size = picture_.defaultSize();
+  size.scale(room.size(), Qt::KeepAspectRatio);
+  QRectF area(QPointF(0, 0), size);
+  area.moveCenter(room.center());
+  return area;
+}
+
+void PictureButton::paintEvent(QPaintEvent* /*event*/) {
+  QPainter painter(this);
+  painter.setRenderHint(QPainter::Antialiasing);
+  PaintPicture(painter);
+  PaintFrame(painter);
+}
+
+void PictureButton::PaintPicture(QPainter& painter) {
+  if (!isEnabled()) painter.setOpacity(kFaded);
+  const QRectF area = PictureArea();
+  picture_.render(&painter, isDown() ? area.translated(1, 1) : area);
+  painter.setOpacity(1);
+}
+
+/// The pointer's frame is full, the focus's is a thin one: the two may stand on one picture.
+void PictureButton::PaintFrame(QPainter& painter) const {
+  if (!bordered_ && !hasFocus()) return;
+  const QColor color = palette().color(QPalette::Highlight);
+  painter.setPen(bordered_ ? QPen(color, kFrameWidth) : QPen(color, 2, Qt::DashLine));
+  const double inset = kFrameWidth / 2;
+  painter.drawRoundedRect(PictureArea()
+                              .adjusted(-kMargin, -kMargin, kMargin, kMargin)
+                              .adjusted(inset, inset, -inset, -inset),
+                          kRadius, kRadius);
+}
+
+}  // namespace marlowbeck

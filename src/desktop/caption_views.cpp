@@ -19,6 +19,10 @@ void PanelView::ShowKind() {
   const std::string& caption = GetControl().Caption();
   if (auto* const group = qobject_cast<QGroupBox*>(Widget())) {
     group->setTitle(ToMnemonicText(caption));
+  } else if (auto* const label = qobject_cast<QLabel*>(Widget())) {
+    label->setTextFormat(Qt::PlainText);
+    label->setText(ToQt(caption));
+    label->setAccessibleName(Spoken(caption));
   } else {
     Widget()->setWindowTitle(ToQt(caption));  // nowhere to be seen, but there to be read
   }
@@ -32,9 +36,13 @@ void PanelView::ShowCommon() {
 }
 
 void PanelView::ReadKind(ControlState& state) const {
-  const auto* const group = qobject_cast<const QGroupBox*>(Widget());
-  state.caption =
-      group != nullptr ? FromMnemonicText(group->title()) : FromQt(Widget()->windowTitle());
+  if (const auto* const group = qobject_cast<const QGroupBox*>(Widget())) {
+    state.caption = FromMnemonicText(group->title());
+  } else if (const auto* const label = qobject_cast<const QLabel*>(Widget())) {
+    state.caption = FromQt(label->text());
+  } else {
+    state.caption = FromQt(Widget()->windowTitle());
+  }
 }
 
 LabelView::LabelView(Control& control, QLabel* label, Windows& windows)

@@ -264,7 +264,7 @@ TEST_F(GradeAndDate, ABlankTeamHidesTheSelectionsAndCanPlay) {
   DoAll({"click imgSheets", "click cmdGotoResults"});
   EXPECT_FALSE(Shown("fraResControls"));
   EXPECT_EQ(Lines("cboResTeam"), (TextList{"", "Hawks"}));
-  EXPECT_EQ(Caption("lblHeader(2)"), "V'S  HAWKS");
+  EXPECT_EQ(Caption("lblHeader(2)"), "v's  HAWKS");
   SaveGoodSheet("Reed,  Jo");
   EXPECT_TRUE(Shown("fraResControls"));
   EXPECT_EQ(Saved().size(), 1U);

@@ -255,7 +255,7 @@ INSTANTIATE_TEST_SUITE_P(
                       "Number of Centuries MUST be EQUAL to\ror GREATER than the number of 180's.",
                       "txtCent",
                       {{"txtCent", ""}, {"txtHowMany180s", "2"}}}),
-    [](const auto& info) { return std::string(info.param.name); });
+    [](const auto& given) { return std::string(given.param.name); });
 
 TEST_F(ScoreBoxes, A180WithAnotherHighScoreIsAskedAboutAndYesSetsIt) {
   TypeInto({{"txtHS", "120"}, {"txtCent", "2"}, {"txtHowMany180s", "2"}});
@@ -317,7 +317,7 @@ INSTANTIATE_TEST_SUITE_P(
                       PegBoxCase{30, {"txtP2", "txtP6"}, {"lblP1", "lblP5"}},
                       PegBoxCase{3, {"txtP2", "txtP4"}, {"lblP1", "lblP3"}},
                       PegBoxCase{111, {"txtP2", "txtP4", "txtP6"}, {"lblP1", "lblP3", "lblP5"}}),
-    [](const auto& info) { return "Code" + std::to_string(info.param.code); });
+    [](const auto& given) { return "Code" + std::to_string(given.param.code); });
 
 TEST_F(ScoreSheets, ACodeBeyondSixteenBitsEndsInTheErrorBox) {
   WritePlayers(kLeagueFile, {Player(1, "Reed", "Jo", "Rovers", "A Grade", 70000),

@@ -101,9 +101,9 @@ INSTANTIATE_TEST_SUITE_P(Codes, PegBoxesOf,
                                            PegCase{30, {true, false, true, true, true, false}},
                                            PegCase{3, {true, false, true, false, true, true}},
                                            PegCase{111, {true, false, true, false, true, false}}),
-                         [](const auto& info) {
-                           return info.param.code < 0 ? std::string("Negative")
-                                                      : std::to_string(info.param.code);
+                         [](const auto& given) {
+                           return given.param.code < 0 ? std::string("Negative")
+                                                       : std::to_string(given.param.code);
                          });
 
 }  // namespace

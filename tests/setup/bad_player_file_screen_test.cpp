@@ -5,23 +5,6 @@ namespace {
 
 using BadPlayerFileTest = SetupTest;
 
-TEST_F(BadPlayerFileTest, WithoutANamedFileTheScreenLeavesAtOnce) {
-  WritePlayers(kPlayerFile, TwoGrades());
-  NameOpenFile(kPlayerFile);
-  Start();
-  for (const char* content : {"\"\"\r\n", ""}) {
-    Do("click imgPlayers");
-    WriteFile("FileName.qz3", content);
-    // The screen reads the name when it comes to the front.
-    Do("click cmdAddCancel");
-    EXPECT_EQ(Front(), "frmDB");
-    NameOpenFile(kPlayerFile);
-    Do("events");
-    Do("click imgPlayers");
-    Do("close frmNames");
-  }
-}
-
 TEST_F(BadPlayerFileTest, AFileCutInARecordShowsItsWholeRecords) {
   OpenSetupOf(FileOf(TwoGrades()).substr(0, 4 * kPlayerLength - 10));
   EXPECT_EQ(Lines("cboAddGrd"), TextList{"A Grade"});

@@ -84,7 +84,7 @@ TEST_F(FirstPlayerTest, SavingGoesOnWithTheLists) {
 
 TEST_F(FirstPlayerTest, TheTextsAreKeptAsTypedAndCutToWidth) {
   Open();
-  Do("type txtAddSn0  Anderson-Featherstonehaugh-Exe");  // 30 with the blank in front
+  Do("type txtAddSn0  Anderson-Featherstonehaugh-Ex");  // 30 with the blank in front
   Do("type txtAddFn0 Bartholomew Maximilian Alexander");
   Do("type txtAddTm0 Rovers, \"the\" Old");
   Do("type txtAddGrd0 A Grade of far too many letters");

@@ -359,7 +359,7 @@ TEST_F(PlayersTest, HelpOpensTheHelpFile) {
 // The way from the score sheet, in a grade of one team.
 class FromTheScoreSheetTest : public SetupTest {
  protected:
-  void ComeFromTheScoreSheet() {
+  void OpenTheScoreSheet() {
     WritePlayers(kPlayerFile, {Player(1, "Archer", "Jo", "Rovers", "A Grade", 330),
                                Player(2, "Cole", "Di", "Hawks", "A Grade", 330),
                                Player(3, "Dale", "Ed", "Bulls", "B Grade", 111)});
@@ -367,12 +367,40 @@ class FromTheScoreSheetTest : public SetupTest {
     NameOpenFile(kPlayerFile);
     Do("click imgSheets");
     Do("pick cboResGrade =B Grade");
+  }
+
+  void GoOnToSetup() {
     Do("answer yes");
     Do("click cmdGotoResults");
+  }
+
+  void ComeFromTheScoreSheet() {
+    OpenTheScoreSheet();
+    GoOnToSetup();
     ASSERT_EQ(Front(), "frmNames");
     ASSERT_EQ(InSession("Flag"), 1);
   }
 };
+
+TEST_F(FromTheScoreSheetTest, WithoutANamedFileItLeavesAtOnce) {
+  OpenTheScoreSheet();
+  WriteFile("FileName.qz3", "");
+  GoOnToSetup();
+  EXPECT_EQ(Boxes().size(), 1U);  // that of the score sheet
+  EXPECT_EQ(Front(), "frmDB");
+  EXPECT_FALSE(Loaded("frmNames"));
+  EXPECT_EQ(InSession("PlayerFile"), "");
+}
+
+TEST_F(FromTheScoreSheetTest, WithAnEmptyNameTheMenuTellsThatNoFileIsOpen) {
+  OpenTheScoreSheet();
+  WriteFile("FileName.qz3", "\"\"\r\n");
+  GoOnToSetup();
+  ASSERT_EQ(Boxes().size(), 2U);
+  EXPECT_TRUE(Boxes()[1].text.starts_with("No Marlowbeck file is open."));
+  EXPECT_EQ(Front(), "frmDB");
+  EXPECT_EQ(Caption("lblHMPlayers"), " No File Open ");
+}
 
 TEST_F(FromTheScoreSheetTest, ExitGoesBackToTheScoreSheet) {
   ComeFromTheScoreSheet();

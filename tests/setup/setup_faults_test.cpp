@@ -9,7 +9,7 @@ namespace {
 
 using Work = SweptWork;
 
-void Run(const Work& work) {
+void BreakEverywhere(const Work& work) {
   EXPECT_GT(SweepFailures(work), 3);
   EXPECT_GT(SweepCutWrites(work), 0);
   EXPECT_GT(SweepPowerCuts(work), 3);
@@ -47,76 +47,78 @@ void ExpectNextPlayerSaved(Club& club) {
 
 TEST(SetupFaults, FirstPlayer) {
   const std::vector<PlayerRecord> after = {Player(1, "Archer", "Jo", "Rovers", "A Grade", 111)};
-  Run({[](Club& club) {
-         Lay(club, {});
-         club.DoAll({"click imgPlayers", "type txtAddSn0 Archer", "type txtAddFn0 Jo",
-                     "type txtAddTm0 Rovers", "type txtAddGrd0 A Grade", "click chkNone"});
-       },
-       {"click cmdAddSave0"},
-       [&](Club& club) {
-         ExpectPlayers(club, {}, after);
-         ExpectNextPlayerSaved(club);
-       }});
+  BreakEverywhere({[](Club& club) {
+                     Lay(club, {});
+                     club.DoAll({"click imgPlayers", "type txtAddSn0 Archer", "type txtAddFn0 Jo",
+                                 "type txtAddTm0 Rovers", "type txtAddGrd0 A Grade",
+                                 "click chkNone"});
+                   },
+                   {"click cmdAddSave0"},
+                   [&](Club& club) {
+                     ExpectPlayers(club, {}, after);
+                     ExpectNextPlayerSaved(club);
+                   }});
 }
 
 TEST(SetupFaults, AddedPlayer) {
   std::vector<PlayerRecord> after = TwoGrades();
   after.push_back(Player(5, "Evans", "Flo", "Bulls", "A Grade", 330));
-  Run({[](Club& club) {
-         Lay(club, TwoGrades());
-         club.DoAll({"click imgPlayers", "type txtAddSn Evans", "type txtAddFn Flo"});
-       },
-       {"click cmdAddSave"},
-       [&](Club& club) {
-         ExpectPlayers(club, TwoGrades(), after);
-         ExpectNextPlayerSaved(club);
-       }});
+  BreakEverywhere({[](Club& club) {
+                     Lay(club, TwoGrades());
+                     club.DoAll({"click imgPlayers", "type txtAddSn Evans", "type txtAddFn Flo"});
+                   },
+                   {"click cmdAddSave"},
+                   [&](Club& club) {
+                     ExpectPlayers(club, TwoGrades(), after);
+                     ExpectNextPlayerSaved(club);
+                   }});
 }
 
 TEST(SetupFaults, ChangeOfBestOfThree) {
   std::vector<PlayerRecord> after = TwoGrades();
   for (std::size_t i = 0; i < 3; ++i) after[i].BestOfThree = 111;
-  Run({[](Club& club) {
-         Lay(club, TwoGrades());
-         club.DoAll({"click imgPlayers", "click cmdEdBOT", "click chkNun"});
-       },
-       {"click cmdNoPOK"},
-       [&](Club& club) {
-         ExpectOneOf(club.File(kPlayerFile), FileOf(TwoGrades()), FileOf(after));
-         ExpectNextPlayerSaved(club);
-       }});
+  BreakEverywhere({[](Club& club) {
+                     Lay(club, TwoGrades());
+                     club.DoAll({"click imgPlayers", "click cmdEdBOT", "click chkNun"});
+                   },
+                   {"click cmdNoPOK"},
+                   [&](Club& club) {
+                     ExpectOneOf(club.File(kPlayerFile), FileOf(TwoGrades()), FileOf(after));
+                     ExpectNextPlayerSaved(club);
+                   }});
 }
 
 TEST(SetupFaults, GameNames) {
   const std::string before = "Triples\r\nDoubles\r\nSingles\r\nTpls\r\nDbls\r\nSgls\r\n";
   const std::string after = "Teams\r\nDoubles\r\nSingles\r\nTpls\r\nDbls\r\nSgls\r\n";
-  Run({[](Club& club) {
-         Lay(club, TwoGrades());
-         club.DoAll({"click mnuGameNames", "type txtFirst Teams"});
-       },
-       {"click cmdSave"},
-       [&](Club& club) {
-         ExpectOneOf(club.File("GameName.qz3"), before, after);
-         club.Try("close frmGameNames");
-         club.DoAll({"click mnuGameNames", "type txtThird Ones", "click cmdSave"});
-         EXPECT_NE(club.File("GameName.qz3").find("\r\nOnes\r\n"), std::string::npos);
-       }});
+  BreakEverywhere({[](Club& club) {
+                     Lay(club, TwoGrades());
+                     club.DoAll({"click mnuGameNames", "type txtFirst Teams"});
+                   },
+                   {"click cmdSave"},
+                   [&](Club& club) {
+                     ExpectOneOf(club.File("GameName.qz3"), before, after);
+                     club.Try("close frmGameNames");
+                     club.DoAll({"click mnuGameNames", "type txtThird Ones", "click cmdSave"});
+                     EXPECT_NE(club.File("GameName.qz3").find("\r\nOnes\r\n"), std::string::npos);
+                   }});
 }
 
 TEST(SetupFaults, GameNamesThatCannotBeReadForAMomentStay) {
   const std::string names = "Teams\r\nPairs\r\nOnes\r\nTms\r\nPrs\r\n1s\r\n";
-  Run({[&](Club& club) {
-         club.WriteFile("GameName.qz3", names);
-         Lay(club, TwoGrades());
-         club.Start();
-       },
-       {"click mnuGameNames"},
-       [&](Club& club) { EXPECT_EQ(club.File("GameName.qz3"), names); }});
+  BreakEverywhere({[&](Club& club) {
+                     club.WriteFile("GameName.qz3", names);
+                     Lay(club, TwoGrades());
+                     club.Start();
+                   },
+                   {"click mnuGameNames"},
+                   [&](Club& club) { EXPECT_EQ(club.File("GameName.qz3"), names); }});
 }
 
 TEST(SetupFaults, SeasonDescription) {
   constexpr const char* kFile = "Winter_B Grade.qzs";
-  Run({[](Club& club) {
+  BreakEverywhere(
+      {[](Club& club) {
          Lay(club, TwoGrades());
          club.WriteFile("Winter_B Grade.qzs", "\"Winter 2003\"\r\n");
          club.DoAll({"click mnuSeason", "pick cboGrades 1", "type txtNewSeason Winter 2004"});

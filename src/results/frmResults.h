@@ -189,8 +189,8 @@ struct frmResults : Screen {
   void OpenHelp();
 
   const Context& context_;
-  /// The one record buffer of the screen: every reading of the results file leaves its last record
-  /// here.
+  /// The one record buffer of the screen, in which readings of the results file leave their last
+  /// record; it is always read anew, if there is anything to read, before a sheet opens.
   ResultRecord record_;
   int other_teams_ = 0;  ///< of the grade, as GetOpp last counted them
 };

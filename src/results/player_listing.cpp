@@ -1,5 +1,7 @@
 #include "results/player_listing.h"
 
+#include "data/competition.h"
+
 namespace marlowbeck {
 namespace {
 
@@ -58,6 +60,19 @@ std::vector<std::string> PlayerListing::Entered() const {
     lines.insert(lines.end(), results, names_[i]);
   }
   return lines;
+}
+
+PlayerListing ReadPlayerListing(Session& session, Channels& channels, std::string_view opposition) {
+  OpenFile(session, channels);
+  PlayerListing listing(session.Team, session.Grade, opposition, session.WorkDate,
+                        session.PlayerCount);
+  channels.ForEachRecord(Channel::Players,
+                         [&](Bytes bytes, int) { listing.AddPlayer(PlayerView(bytes)); });
+  OpenResultSFile(session, channels);
+  channels.ForEachRecord(Channel::Results,
+                         [&](Bytes bytes, int) { listing.AddResult(ResultView(bytes)); });
+  channels.CloseAll();
+  return listing;
 }
 
 }  // namespace marlowbeck

@@ -5,8 +5,10 @@
 #include <unordered_map>
 #include <vector>
 
+#include "data/channels.h"
 #include "data/integer.h"
 #include "data/records.h"
+#include "data/session.h"
 #include "data/table.h"
 
 namespace marlowbeck {
@@ -43,5 +45,10 @@ class PlayerListing {
   std::unordered_map<int, std::vector<int>> places_;  ///< where in the tables an id stands
   std::vector<int> results_;                          ///< how many each listed player has
 };
+
+/// The listing of the team, grade and work date in hand, from one reading of each file. Leaves all
+/// channels closed.
+[[nodiscard]] PlayerListing ReadPlayerListing(Session& session, Channels& channels,
+                                              std::string_view opposition);
 
 }  // namespace marlowbeck

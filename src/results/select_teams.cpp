@@ -157,28 +157,17 @@ void frmResults::Heading() {
 }
 
 void frmResults::GetPlayers() {
-  Session& session = context_.session;
-  Channels& channels = context_.channels;
   lstResPlayers.Clear();
   lstFinished.Clear();
   cboResTeam.Enable();
-  OpenFile(session, channels);
-  PlayerListing listing(session.Team, session.Grade, Trimmed(cboOpp.Text()), session.WorkDate,
-                        session.PlayerCount);
-  channels.ForEachRecord(Channel::Players,
-                         [&](Bytes bytes, int) { listing.AddPlayer(PlayerView(bytes)); });
-  OpenResultSFile(session, channels);
-  ForEachResult([&](const ResultView& result, int) {
-    listing.AddResult(result);
-    return true;
-  });
+  const PlayerListing listing =
+      ReadPlayerListing(context_.session, context_.channels, Trimmed(cboOpp.Text()));
   for (const std::string& line : listing.ToEnter()) lstResPlayers.AddLine(line);
   for (const std::string& line : listing.Entered()) lstFinished.AddLine(line);
   const int entered = lstFinished.Count();
   lblEntered.SetCaption(
       entered > 0 ? "Entered Players = " + std::to_string(entered) + "  [Click to Edit]" : "");
   if (entered > 0) cboOpp.Disable();
-  channels.CloseAll();
 }
 
 }  // namespace marlowbeck

@@ -90,7 +90,7 @@ double AverageHundredfold(double aggregate, double shots) {
 }
 
 double Divide(double a, double b) {
-  if (b == 0) throw RunTimeError(a == 0 ? ErrorNumber::Overflow : ErrorNumber::DivisionByZero);
+  if (b == 0) throw RunTimeError(ErrorNumber::DivisionByZero);
   return a / b;
 }
 

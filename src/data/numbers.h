@@ -35,7 +35,7 @@ namespace marlowbeck {
 /// write it. The same number, since a product is the same either way round. `shots` must not be 0.
 [[nodiscard]] double AverageHundredfold(double aggregate, double shots);
 
-/// a / b as the records' arithmetic has it: throws DivisionByZero (0 / 0 Overflow) for b = 0.
+/// a / b; throws DivisionByZero for b = 0, whatever a is.
 [[nodiscard]] double Divide(double a, double b);
 
 }  // namespace marlowbeck

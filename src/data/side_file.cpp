@@ -51,6 +51,8 @@ std::string SideFileReader::Text() { return Item(); }
 
 std::string SideFileReader::TextToFirstQuote() { return Item(Quotes::ToFirst); }
 
+std::string SideFileReader::TextToLastQuote() { return Item(Quotes::ToLast); }
+
 double SideFileReader::Number() { return NumberOf(Item()); }
 
 Date SideFileReader::Day() {
@@ -78,9 +80,7 @@ std::string SideFileReader::Item(Quotes quotes) {
   }
   std::string item;
   if (content_[place_] == '"') {
-    const auto end = quotes == Quotes::WholeText
-                         ? ClosingQuote()
-                         : std::min(content_.find('"', place_ + 1), content_.size());
+    const auto end = ClosingQuote(quotes);
     item = content_.substr(place_ + 1, end - place_ - 1);
     place_ = end;
     place_ = std::min(content_.find_first_of(",\r\n", place_), content_.size());
@@ -93,16 +93,19 @@ std::string SideFileReader::Item(Quotes quotes) {
   return item;
 }
 
-/// Where the quoted text ends that begins at the present place: at the first quote of its line with
-/// nothing but blanks between it and the item's end, or else at the first quote there is.
-std::size_t SideFileReader::ClosingQuote() const {
-  const auto line_end = content_.find_first_of("\r\n", place_);
-  const auto first = content_.find('"', place_ + 1);
+/// Where the quoted text ends that begins at the present place. A whole text ends at the first
+/// quote of its line with nothing but blanks between it and the item's end, or else at the first
+/// quote there is.
+std::size_t SideFileReader::ClosingQuote(Quotes quotes) const {
+  const auto line_end = std::min(content_.find_first_of("\r\n", place_), content_.size());
+  const auto first = std::min(content_.find('"', place_ + 1), content_.size());
+  if (quotes == Quotes::ToFirst || first >= line_end) return first;
+  if (quotes == Quotes::ToLast) return content_.rfind('"', line_end - 1);
   for (auto quote = first; quote < line_end; quote = content_.find('"', quote + 1)) {
     const auto next = content_.find_first_not_of(" \t", quote + 1);
     if (next == std::string::npos || next == line_end || content_[next] == ',') return quote;
   }
-  return std::min(first, content_.size());
+  return first;
 }
 
 void SideFileReader::PassSeparator() {

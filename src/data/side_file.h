@@ -41,14 +41,17 @@ class SideFileReader {
   [[nodiscard]] std::string Text();
   /// As Text, but that a quoted text ends at the first quote there is.
   [[nodiscard]] std::string TextToFirstQuote();
+  /// As Text, but that a quoted text ends at the last quote of its line, whatever it holds: for a
+  /// line that has no other text.
+  [[nodiscard]] std::string TextToLastQuote();
   [[nodiscard]] double Number();
   [[nodiscard]] Date Day();
   [[nodiscard]] bool Truth();
 
  private:
-  enum class Quotes { WholeText, ToFirst };
+  enum class Quotes { WholeText, ToFirst, ToLast };
   std::string Item(Quotes quotes = Quotes::WholeText);
-  [[nodiscard]] std::size_t ClosingQuote() const;
+  [[nodiscard]] std::size_t ClosingQuote(Quotes quotes) const;
   void PassSeparator();
 
   std::string content_;

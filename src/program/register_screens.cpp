@@ -11,6 +11,7 @@
 #include "setup/frmGameNames.h"
 #include "setup/frmNames.h"
 #include "setup/frmSeason.h"
+#include "stats/frmPMenu.h"
 
 namespace marlowbeck {
 namespace {
@@ -31,6 +32,7 @@ void RegisterScreens(Screens& screens, const Context& context) {
   Register<frmGameNames>(screens, "frmGameNames", context);
   Register<frmSeason>(screens, "frmSeason", context);
   Register<frmResults>(screens, "frmResults", context);
+  Register<frmPMenu>(screens, "frmPMenu", context);
   Register<frmErrors>(screens, "frmErrors", context);
 }
 

@@ -35,6 +35,13 @@ class Picture : public Control {
   Picture(const Owner& owner, std::string_view name, std::string_view caption = {})
       : Control(owner, Kind::Picture, name, caption) {}
   [[nodiscard]] bool TakesFocus() const override { return true; }
+
+  /// The control at whose height it stands; null for a picture with a place of its own.
+  [[nodiscard]] const Control* Beside() const { return beside_; }
+  void SetBeside(const Control& control) { Assign(beside_, &control); }
+
+ private:
+  const Control* beside_ = nullptr;
 };
 
 /// A menu of the menu bar, or an entry of one.

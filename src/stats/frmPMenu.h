@@ -1,0 +1,127 @@
+#pragma once
+
+#include <array>
+#include <vector>
+
+#include "stats/progressive_details.h"
+#include "ui/context.h"
+#include "ui/controls.h"
+#include "ui/screen.h"
+
+namespace marlowbeck {
+
+/// The Reports screen: a menu of reports over panels that take turns. Every report is worked out
+/// afresh from the player and result records each time it is asked for.
+struct frmPMenu : Screen {
+  frmPMenu(Screens& screens, const Context& context);
+
+  // The menu of reports, with the ball that points at the entry under the pointer.
+  Panel fraMenu{*this, "fraMenu"};
+  Picture Image1{fraMenu, "Image1", "Highest Averages"};
+  Picture Image3{fraMenu, "Image3", "Highest Pegs"};
+  Picture Image2{fraMenu, "Image2", "Highest Scores"};
+  Picture Image4{fraMenu, "Image4", "Most Pegs"};
+  Picture Image5{fraMenu, "Image5", "Most Centuries"};
+  Picture Image9{fraMenu, "Image9", "Most 180's"};
+  Picture Image6{fraMenu, "Image6", "Weekly Results"};
+  Picture Image7{fraMenu, "Image7", "Season Report"};
+  Picture Image8{fraMenu, "Image8", "Peg Ratios"};
+  Picture Image12{fraMenu, "Image12", "Name Search"};
+  Picture Image10{fraMenu, "Image10", "Exit"};
+  Picture imgBall{fraMenu, "imgBall"};
+
+  // Weekly results: what to show, and what to do with it.
+  Panel fraWeek{*this, "fraWeek", "Team Results"};
+  Label lblSeason1{fraWeek, "lblSeason1"};
+  ComboBox cboResGrade{fraWeek, "cboResGrade", "Select Grade:"};
+  ComboBox cboResTeam{fraWeek, "cboResTeam", "Select Team:"};
+  ListBox lstAllDates{fraWeek, "lstAllDates", "Dates Played:"};
+  Command cmdChangeDate{fraWeek, "cmdChangeDate", "Change Game Date : "};
+  Command cmdPrintLad{fraWeek, "cmdPrintLad", "Print"};
+  Command cmdClipWeek{fraWeek, "cmdClipWeek", "Copy to Clipboard"};
+  Command cmdPlrResExit{fraWeek, "cmdPlrResExit", "Help"};
+  Command cmdCancelWK{fraWeek, "cmdCancelWK", "Exit"};
+
+  // The team's night and, below it, its season up to that night.
+  Panel fraWkProg{*this, "fraWkProg"};
+  Label lblOpp{fraWkProg, "lblOpp"};
+  Label lblDT{fraWkProg, "lblDT"};
+  Grid grdWeek{fraWkProg, "grdWeek"};
+  Label lblProgInfo{fraWkProg, "lblProgInfo"};
+  Grid grdProg{fraWkProg, "grdProg"};
+  Panel fraFFYesNo{fraWkProg, "fraFFYesNo"};
+  Label Label13{fraFFYesNo, "Label13",
+                "Include Forfeits in All Games Played in Progressive Details ?"};
+  OptionButton optFFyes{fraFFYesNo, "optFFyes", "Yes"};
+  OptionButton optFFno{fraFFYesNo, "optFFno", "No"};
+
+  Label lblNoneFound{*this, "lblNoneFound"};
+
+  // The lists of the highest.
+  Label lblSeason{*this, "lblSeason"};
+  Panel fraPikHi{*this, "fraPikHi"};
+  Panel fraHi{*this, "fraHi"};
+  Command cmdHcap{fraHi, "cmdHcap", "Handicaps"};
+  Command cmdReDoAvgs{*this, "cmdReDoAvgs", "List "};
+  Panel FraCombineOptions{*this, "FraCombineOptions"};
+
+  // The printer font and the print panels.
+  Panel fraFontPick{*this, "fraFontPick", "Printer Font"};
+  Label lblFont{fraFontPick, "lblFont"};
+  Label lblPrFont{fraFontPick, "lblPrFont"};
+  Label lblFontInfo{*this, "lblFontInfo", " Click to change font. "};
+  Panel picPrint{*this, "picPrint", "Print Options"};
+  Command cmdWeekHelp{picPrint, "cmdWeekHelp", "Help"};
+  Panel picPrintHI{*this, "picPrintHI", "Print Options"};
+
+  void Load() override;
+  void Unload() override;
+
+  // The menu.
+  void StartScreen();
+  void WorkScreen();
+  void HideAll();
+  void GetPlayerFileName();
+  void Image6_Click();
+  void Image12_Click();
+  /// Marks the entry that the pointer is over.
+  void PointAt(Picture& entry);
+  void PointAtNothing();
+
+  // Weekly results.
+  void DoWeekly();
+  void GetDates();
+  void ListDates();
+  void FillGrids();
+  void CalcWeekly();
+  void GridWeekly();
+  void ClearWeekGrids();
+  void GetSeason();
+  void cboResGrade_Click();
+  void cboResTeam_Click();
+  void cmdChangeDate_Click();
+  void grdWeek_DoubleClick();
+
+  // Progressive details.
+  void CalcProg();
+  void GridProg();
+  void optFFyes_Click();
+  void optFFno_Click();
+
+ private:
+  void WireMenu();
+  void WireWeekly();
+  [[nodiscard]] std::array<Picture*, 11> Entries();
+  void TakeSelection();
+  void OfferNight(bool any);
+  void KeepForfeitsChoice(bool included);
+  void OpenReport(int choice, std::string_view screen);
+  /// Hides this screen and shows another, where there is such a screen.
+  void GoTo(std::string_view screen);
+
+  const Context& context_;
+  Session& session_;
+  std::vector<ProgressiveRow> progressive_;  ///< the rows of the last CalcProg
+};
+
+}  // namespace marlowbeck

@@ -1,0 +1,176 @@
+#include <array>
+
+#include "data/competition.h"
+#include "data/text.h"
+#include "session/season.h"
+#include "session/shared_procedures.h"
+#include "stats/frmPMenu.h"
+#include "stats/grid_rows.h"
+#include "stats/team_dates.h"
+#include "stats/weekly_results.h"
+
+namespace marlowbeck {
+namespace {
+
+constexpr const char* kWeeklyFile = "weekly.qz3";
+constexpr const char* kTeamResults = "Team Results";
+
+}  // namespace
+
+void frmPMenu::DoWeekly() {
+  fraWeek.SetCaption(kTeamResults);
+  lblSeason1.SetCaption({});
+  GetGrades(context_, cboResGrade);
+  // Without a grade there is no season to have a title.
+  if (cboResGrade.Count() == 0) return;
+  cboResGrade.SetIndex(0);
+  GetSeason();
+  lblSeason1.SetCaption(session_.SeasonDescription);
+}
+
+void frmPMenu::GetSeason() {
+  marlowbeck::GetSeason(context_);
+  lblSeason.SetCaption(session_.SeasonDescription);
+}
+
+/// What is picked becomes the team and grade in hand, whose files the reports read.
+void frmPMenu::TakeSelection() {
+  session_.Team = Trimmed(cboResTeam.Text());
+  session_.Grade = Trimmed(cboResGrade.Text());
+  NameGradeFiles(session_);
+}
+
+void frmPMenu::cboResGrade_Click() {
+  TakeSelection();
+  GetTeams(context_, session_.Grade, cboResTeam);
+  if (cboResTeam.Count() > 0) cboResTeam.SetIndex(0);
+}
+
+void frmPMenu::cboResTeam_Click() {
+  TakeSelection();
+  GetDates();
+  ListDates();
+}
+
+void frmPMenu::GetDates() {
+  session_.TeamDates.clear();
+  session_.DateCount = 0;
+  OpenResultSFile(session_, context_.channels);
+  TeamDates dates(session_.Team);
+  context_.channels.ForEachRecord(Channel::Results,
+                                  [&](Bytes bytes, int) { dates.AddResult(ResultView(bytes)); });
+  context_.channels.CloseAll();
+  session_.TeamDates = dates.Sorted();
+  session_.DateCount = static_cast<int>(session_.TeamDates.size());
+}
+
+void frmPMenu::ListDates() {
+  lstAllDates.Clear();
+  lblNoneFound.Hide();
+  OfferNight(false);
+  std::vector<std::string> lines;
+  for (const Date date : session_.TeamDates) lines.push_back(ShortDate(date));
+  for (const std::string& line : lines) lstAllDates.AddLine(line);
+  if (lines.empty()) {
+    lblNoneFound.SetCaption("  No results found for: \r " + session_.Team + ",  " + session_.Grade +
+                            ".  ");
+    lblNoneFound.Show();
+    return;
+  }
+  OfferNight(true);
+  lstAllDates.SetIndex(lstAllDates.Count() - 1);
+}
+
+/// What there is to see and to do with a night, or with none.
+void frmPMenu::OfferNight(bool any) {
+  fraWkProg.SetVisible(any);
+  cmdPrintLad.SetEnabled(any);
+  cmdClipWeek.SetEnabled(any);
+  cmdChangeDate.SetVisible(any);
+}
+
+void frmPMenu::FillGrids() {
+  if (fraWeek.Caption() != kTeamResults) return;
+  ClearWeekGrids();
+  if (lstAllDates.Count() == 0) {
+    ListDates();
+    return;
+  }
+  CalcWeekly();
+  GridWeekly();
+  CalcProg();
+  GridProg();
+}
+
+void frmPMenu::ClearWeekGrids() {
+  for (const auto& [grid, nothing] : {std::pair{&grdWeek, ""}, std::pair{&grdProg, " "}}) {
+    grid->Hide();
+    for (int row = 1; row < grid->Rows(); ++row) {
+      for (int col = 0; col < grid->Cols(); ++col) grid->SetCell(row, col, nothing);
+    }
+    grid->Show();
+  }
+}
+
+void frmPMenu::CalcWeekly() {
+  TakeSelection();
+  session_.WorkDate = DateFromText(lstAllDates.Line(lstAllDates.Index()));
+  WeeklyResults weekly(session_.Team, session_.WorkDate);
+  Channels& channels = context_.channels;
+  OpenResultSFile(session_, channels);
+  channels.ForEachRecord(Channel::Results,
+                         [&](Bytes bytes, int) { weekly.AddResult(ResultView(bytes)); });
+  OpenFile(session_, channels);
+  channels.ForEachRecord(Channel::Players,
+                         [&](Bytes bytes, int) { weekly.AddPlayer(PlayerView(bytes)); });
+  channels.CloseAll();
+  if (const auto opposition = weekly.Opposition()) session_.Opposition = *opposition;
+  const std::vector<WeeklyRow> rows = weekly.Rows();
+  session_.RowCount = static_cast<int>(rows.size());
+  context_.GoToWorkingFolder();
+  channels.OpenOutput(Channel::Side, kWeeklyFile, Keeping::Working);
+  WriteWeekly(channels.Writer(Channel::Side), rows);
+  channels.CloseAll();
+}
+
+void frmPMenu::GridWeekly() {
+  const std::string date = ShortDate(session_.WorkDate);
+  lblOpp.SetCaption(session_.Team + "  (" + session_.Grade + ")");
+  lblDT.SetCaption(date + " (v's " + session_.Opposition + ")");
+  cmdChangeDate.SetCaption("Change Game Date: " + date);
+  context_.GoToWorkingFolder();
+  context_.channels.OpenInput(Channel::Side, kWeeklyFile);
+  const auto rows = ReadWeekly(context_.channels.Reader(Channel::Side), session_.RowCount);
+  context_.channels.CloseAll();
+  const auto& games = session_.GameNames;
+  grdWeek.SetSize(session_.RowCount + 1, 10);
+  SetRow<10>(grdWeek, 0,
+             {"\rPlayer", "\rAgg", "\rShots", "\r180's", "\r100's", "High\rScore",
+              games[0] + "\rPegs", games[1] + "\rPegs", games[2] + "\rPegs", "\rAvg"});
+  int row = 0;
+  for (const WeeklyRow& weekly : rows) SetRow(grdWeek, ++row, WeeklyCells(weekly));
+}
+
+void frmPMenu::cmdChangeDate_Click() {
+  if (!session_.WorkDate.IsSet()) return;
+  context_.GoToWorkingFolder();
+  WriteWorkDate(context_.channels, session_.WorkDate);
+  WriteOneString(context_.channels, "dc.qz3", session_.Team);
+  GoTo("frmChangeDate");
+}
+
+void frmPMenu::grdWeek_DoubleClick() {
+  const std::string player = grdWeek.Cell(grdWeek.Row(), 0);
+  // The heading row has no player, and neither has a row that an error left blank.
+  if (grdWeek.Col() != 0 || grdWeek.Row() == 0 || player.empty()) return;
+  context_.GoToWorkingFolder();
+  context_.channels.OpenOutput(Channel::Side, "qzEdScor.qz3", Keeping::Lasting);
+  for (const std::string& item : {cboResGrade.Text(), cboResTeam.Text(), session_.Opposition,
+                                  ShortDate(session_.WorkDate), player}) {
+    context_.channels.Writer(Channel::Side).Text(item).EndLine();
+  }
+  context_.channels.CloseAll();
+  GoTo("frmEdScore");
+}
+
+}  // namespace marlowbeck

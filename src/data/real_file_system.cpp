@@ -88,6 +88,9 @@ constexpr int kBinary = O_BINARY;
 constexpr int kSyncAccess = O_RDWR;
 int OpenDescriptor(const fs::path& path, int flags) { return _wopen(path.c_str(), flags, 0666); }
 int SyncDescriptor(int descriptor) { return _commit(descriptor); }
+int CutDescriptor(int descriptor, std::uint64_t length) {
+  return _chsize_s(descriptor, static_cast<long long>(length)) == 0 ? 0 : -1;
+}
 void SyncFolderOf(const fs::path&) {}  // a rename reaches the disk with the volume's own journal
 long ReadSome(int descriptor, void* into, std::size_t size, std::uint64_t position) {
   if (_lseeki64(descriptor, static_cast<long long>(position), SEEK_SET) < 0) return -1;
@@ -102,6 +105,9 @@ constexpr int kBinary = O_CLOEXEC;
 constexpr int kSyncAccess = O_RDONLY;  // a copy may be as read-only as its source
 int OpenDescriptor(const fs::path& path, int flags) { return ::open(path.c_str(), flags, 0666); }
 int SyncDescriptor(int descriptor) { return ::fsync(descriptor); }
+int CutDescriptor(int descriptor, std::uint64_t length) {
+  return ::ftruncate(descriptor, static_cast<off_t>(length));
+}
 void SyncFolderOf(const fs::path& path) {
   const fs::path folder = path.parent_path();
   const int descriptor = ::open(folder.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC);
@@ -119,12 +125,16 @@ long WriteSome(int descriptor, const void* from, std::size_t size, std::uint64_t
 
 class RealFile : public File {
  public:
-  RealFile(int descriptor, fs::path path, bool is_new)
-      : descriptor_(descriptor), path_(std::move(path)), is_new_(is_new) {}
+  /// A `rewritten` file ends, once it is synced or closed, where the last write ended. It is not
+  /// emptied before: some disks wait for the bytes of every file that was.
+  RealFile(int descriptor, fs::path path, bool is_new, bool rewritten)
+      : descriptor_(descriptor), path_(std::move(path)), is_new_(is_new), rewritten_(rewritten) {}
   RealFile(const RealFile&) = delete;
   RealFile& operator=(const RealFile&) = delete;
   ~RealFile() override {
-    if (descriptor_ >= 0) ::close(descriptor_);
+    if (descriptor_ < 0) return;
+    if (rewritten_) static_cast<void>(CutDescriptor(descriptor_, end_) == 0);
+    ::close(descriptor_);
   }
 
   std::uint64_t Length() override {
@@ -155,22 +165,32 @@ class RealFile : public File {
       if (count <= 0) Fail(count < 0 ? errno : ENOSPC, path_);
       done += static_cast<std::size_t>(count);
     }
+    end_ = std::max(end_, position + from.size());
   }
 
   void Sync() override {
+    CutRest();
     if (SyncDescriptor(descriptor_) != 0) Fail(errno, path_);
     if (std::exchange(is_new_, false)) SyncFolderOf(path_);
   }
 
   void Close() override {
+    if (descriptor_ >= 0) CutRest();
     const int descriptor = std::exchange(descriptor_, -1);
     if (descriptor >= 0 && ::close(descriptor) != 0 && errno != EINTR) Fail(errno, path_);
   }
 
  private:
+  void CutRest() {
+    if (!rewritten_ || Length() <= end_) return;
+    if (CutDescriptor(descriptor_, end_) != 0) Fail(errno, path_);
+  }
+
   int descriptor_;
   fs::path path_;
   bool is_new_;
+  bool rewritten_;
+  std::uint64_t end_ = 0;  ///< of all that was written
 };
 
 /// All that lies in a folder, in no order. An error ends the walk and is told.
@@ -213,7 +233,7 @@ void RefuseProtected(const fs::path& path) {
 void SyncFile(const fs::path& path) {
   const int descriptor = OpenDescriptor(path, kSyncAccess | kBinary);
   if (descriptor < 0) return;  // one that may not be opened is left to the system
-  RealFile file(descriptor, path, true);
+  RealFile file(descriptor, path, true, false);
   file.Sync();
   file.Close();
 }
@@ -275,18 +295,17 @@ std::unique_ptr<File> RealFileSystem::Open(const std::string& path, OpenMode mod
   if (mode == OpenMode::Read) {
     const int descriptor = OpenDescriptor(located, O_RDONLY | kBinary);
     if (descriptor < 0) Fail(errno, located);
-    return std::make_unique<RealFile>(descriptor, located, false);
+    return std::make_unique<RealFile>(descriptor, located, false, false);
   }
   const bool is_new = !fs::exists(located, error);
-  const int emptying = mode == OpenMode::Truncate ? O_TRUNC : 0;
-  int descriptor = OpenDescriptor(located, O_RDWR | O_CREAT | emptying | kBinary);
+  int descriptor = OpenDescriptor(located, O_RDWR | O_CREAT | kBinary);
   if (descriptor < 0 && mode == OpenMode::ReadWrite && !is_new &&
       (errno == EACCES || errno == EPERM || errno == EROFS)) {
     // A season on a read-only disk can still be looked at; only a write to it fails.
     descriptor = OpenDescriptor(located, O_RDONLY | kBinary);
   }
   if (descriptor < 0) Fail(errno, located);
-  return std::make_unique<RealFile>(descriptor, located, is_new);
+  return std::make_unique<RealFile>(descriptor, located, is_new, mode == OpenMode::Truncate);
 }
 
 bool RealFileSystem::Exists(const std::string& path) {

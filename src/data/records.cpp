@@ -9,15 +9,6 @@ namespace marlowbeck {
 namespace {
 
 template <typename Unsigned>
-Unsigned ReadUnsigned(Bytes record, std::size_t offset) {
-  Unsigned value = 0;
-  for (std::size_t i = sizeof(Unsigned); i-- > 0;) {
-    value = static_cast<Unsigned>(value << 8) | std::to_integer<Unsigned>(record[offset + i]);
-  }
-  return value;
-}
-
-template <typename Unsigned>
 void WriteUnsigned(std::span<std::byte> record, std::size_t offset, Unsigned value) {
   for (std::size_t i = 0; i < sizeof(Unsigned); ++i) {
     record[offset + i] = static_cast<std::byte>(value >> (8 * i));
@@ -76,18 +67,6 @@ class FieldReader {
 };
 
 }  // namespace
-
-std::int16_t ReadInteger(Bytes record, std::size_t offset) {
-  return static_cast<std::int16_t>(ReadUnsigned<std::uint16_t>(record, offset));
-}
-
-std::int32_t ReadLong(Bytes record, std::size_t offset) {
-  return static_cast<std::int32_t>(ReadUnsigned<std::uint32_t>(record, offset));
-}
-
-Date ReadDate(Bytes record, std::size_t offset) {
-  return Date{std::bit_cast<double>(ReadUnsigned<std::uint64_t>(record, offset))};
-}
 
 std::string_view ReadText(Bytes record, std::size_t offset, std::size_t width) {
   // Bytes may be looked at as characters: this is no cast of a record's layout.

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <array>
+#include <bit>
 #include <cstddef>
 #include <cstdint>
 #include <span>
@@ -90,9 +91,23 @@ static_assert(FillsRecord(kLadderFields, kLadderLength));
 using Bytes = std::span<const std::byte>;
 
 /// Numbers and texts at an offset of a record's bytes.
-[[nodiscard]] std::int16_t ReadInteger(Bytes record, std::size_t offset);
-[[nodiscard]] std::int32_t ReadLong(Bytes record, std::size_t offset);
-[[nodiscard]] Date ReadDate(Bytes record, std::size_t offset);
+template <typename Unsigned>
+[[nodiscard]] Unsigned ReadUnsigned(Bytes record, std::size_t offset) {
+  Unsigned value = 0;
+  for (std::size_t i = sizeof(Unsigned); i-- > 0;) {
+    value = static_cast<Unsigned>(value << 8) | std::to_integer<Unsigned>(record[offset + i]);
+  }
+  return value;
+}
+[[nodiscard]] inline std::int16_t ReadInteger(Bytes record, std::size_t offset) {
+  return static_cast<std::int16_t>(ReadUnsigned<std::uint16_t>(record, offset));
+}
+[[nodiscard]] inline std::int32_t ReadLong(Bytes record, std::size_t offset) {
+  return static_cast<std::int32_t>(ReadUnsigned<std::uint32_t>(record, offset));
+}
+[[nodiscard]] inline Date ReadDate(Bytes record, std::size_t offset) {
+  return Date{std::bit_cast<double>(ReadUnsigned<std::uint64_t>(record, offset))};
+}
 [[nodiscard]] std::string_view ReadText(Bytes record, std::size_t offset, std::size_t width);
 
 /// One player of one grade. Texts are as the record holds them, padding included, once decoded.

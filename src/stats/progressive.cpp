@@ -1,30 +1,16 @@
 #include <algorithm>
 
-#include "data/competition.h"
 #include "session/forfeits_choice.h"
 #include "stats/frmPMenu.h"
 #include "stats/grid_rows.h"
+#include "stats/team_reports.h"
 
 namespace marlowbeck {
 
 void frmPMenu::CalcProg() {
-  session_.RowCount = 0;
   progressive_.clear();
-  ProgressiveDetails details(session_.Team, session_.Grade, session_.WorkDate);
-  Channels& channels = context_.channels;
-  OpenFile(session_, channels);
-  channels.ForEachRecord(Channel::Players,
-                         [&](Bytes bytes, int) { details.AddPlayer(PlayerView(bytes)); });
-  OpenResultSFile(session_, channels);
-  channels.ForEachRecord(Channel::Results,
-                         [&](Bytes bytes, int) { details.AddResult(ResultView(bytes)); });
-  channels.CloseAll();
-  progressive_ = details.Rows();
-  session_.RowCount = static_cast<int>(progressive_.size());
   context_.GoToWorkingFolder();
-  channels.OpenOutput(Channel::Side, "progweek.qz3", Keeping::Working);
-  WriteProgressive(channels.Writer(Channel::Side), progressive_);
-  channels.CloseAll();
+  progressive_ = marlowbeck::CalcProg(session_, context_.channels);
 }
 
 void frmPMenu::GridProg() {

@@ -1,7 +1,6 @@
 #include "stats/progressive_details.h"
 
 #include <algorithm>
-#include <utility>
 
 #include "data/gap_sort.h"
 #include "data/numbers.h"
@@ -15,13 +14,13 @@ void ProgressiveDetails::AddPlayer(const PlayerView& player) {
   if (player.Team() != team_ || player.Grade() != grade_) return;
   if (players_.size() >= kReportPlaces) throw RunTimeError(ErrorNumber::SubscriptOutOfRange);
   players_.emplace_back(player.FullName(", "), player.ID());
-  sums_.try_emplace(player.ID());
+  if (ids_.Add(player.ID()) == static_cast<int>(sums_.size())) sums_.emplace_back();
 }
 
 void ProgressiveDetails::AddResult(const ResultView& result) {
   if (result.GameDate() > until_) return;
-  const auto place = sums_.find(result.ID());
-  if (place != sums_.end()) Count(place->second, result);
+  const int place = ids_.Find(result.ID());
+  if (place != IdIndex::kNone) Count(sums_[static_cast<std::size_t>(place)], result);
 }
 
 void ProgressiveDetails::Count(Sums& sums, const ResultView& result) {
@@ -49,7 +48,7 @@ void ProgressiveDetails::CountPegs(ProgressiveRow& totals, const ResultView& res
 }
 
 ProgressiveRow ProgressiveDetails::RowOf(const std::string& name, std::int32_t id) const {
-  const Sums& sums = sums_.at(id);
+  const Sums& sums = sums_[static_cast<std::size_t>(ids_.Find(id))];
   ProgressiveRow row = sums.totals;
   row.name = name;
   row.id = id;

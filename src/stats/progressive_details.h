@@ -2,14 +2,14 @@
 
 #include <array>
 #include <cstdint>
-#include <optional>
 #include <string>
 #include <string_view>
-#include <unordered_map>
+#include <utility>
 #include <vector>
 
 #include "data/records.h"
 #include "data/side_file.h"
+#include "stats/id_index.h"
 
 namespace marlowbeck {
 
@@ -63,7 +63,8 @@ class ProgressiveDetails {
   std::string_view grade_;
   Date until_;
   std::vector<std::pair<std::string, std::int32_t>> players_;  ///< name and id
-  std::unordered_map<std::int32_t, Sums> sums_;
+  IdIndex ids_;
+  std::vector<Sums> sums_;  ///< of the ids in their places
 };
 
 /// A line a row: name, agg, shots, hs, c180, c100, pegs, hipeg, games, avg.

@@ -6,13 +6,11 @@
 #include "session/shared_procedures.h"
 #include "stats/frmPMenu.h"
 #include "stats/grid_rows.h"
-#include "stats/team_dates.h"
-#include "stats/weekly_results.h"
+#include "stats/team_reports.h"
 
 namespace marlowbeck {
 namespace {
 
-constexpr const char* kWeeklyFile = "weekly.qz3";
 constexpr const char* kTeamResults = "Team Results";
 
 }  // namespace
@@ -52,17 +50,7 @@ void frmPMenu::cboResTeam_Click() {
   ListDates();
 }
 
-void frmPMenu::GetDates() {
-  session_.TeamDates.clear();
-  session_.DateCount = 0;
-  OpenResultSFile(session_, context_.channels);
-  TeamDates dates(session_.Team);
-  context_.channels.ForEachRecord(Channel::Results,
-                                  [&](Bytes bytes, int) { dates.AddResult(ResultView(bytes)); });
-  context_.channels.CloseAll();
-  session_.TeamDates = dates.Sorted();
-  session_.DateCount = static_cast<int>(session_.TeamDates.size());
-}
+void frmPMenu::GetDates() { marlowbeck::GetDates(session_, context_.channels); }
 
 void frmPMenu::ListDates() {
   lstAllDates.Clear();
@@ -115,22 +103,8 @@ void frmPMenu::ClearWeekGrids() {
 void frmPMenu::CalcWeekly() {
   TakeSelection();
   session_.WorkDate = DateFromText(lstAllDates.Line(lstAllDates.Index()));
-  WeeklyResults weekly(session_.Team, session_.WorkDate);
-  Channels& channels = context_.channels;
-  OpenResultSFile(session_, channels);
-  channels.ForEachRecord(Channel::Results,
-                         [&](Bytes bytes, int) { weekly.AddResult(ResultView(bytes)); });
-  OpenFile(session_, channels);
-  channels.ForEachRecord(Channel::Players,
-                         [&](Bytes bytes, int) { weekly.AddPlayer(PlayerView(bytes)); });
-  channels.CloseAll();
-  if (const auto opposition = weekly.Opposition()) session_.Opposition = *opposition;
-  const std::vector<WeeklyRow> rows = weekly.Rows();
-  session_.RowCount = static_cast<int>(rows.size());
   context_.GoToWorkingFolder();
-  channels.OpenOutput(Channel::Side, kWeeklyFile, Keeping::Working);
-  WriteWeekly(channels.Writer(Channel::Side), rows);
-  channels.CloseAll();
+  marlowbeck::CalcWeekly(session_, context_.channels);
 }
 
 void frmPMenu::GridWeekly() {
@@ -139,9 +113,7 @@ void frmPMenu::GridWeekly() {
   lblDT.SetCaption(date + " (v's " + session_.Opposition + ")");
   cmdChangeDate.SetCaption("Change Game Date: " + date);
   context_.GoToWorkingFolder();
-  context_.channels.OpenInput(Channel::Side, kWeeklyFile);
-  const auto rows = ReadWeekly(context_.channels.Reader(Channel::Side), session_.RowCount);
-  context_.channels.CloseAll();
+  const auto rows = ReadWeeklyFile(session_, context_.channels);
   const auto& games = session_.GameNames;
   grdWeek.SetSize(session_.RowCount + 1, 10);
   SetRow<10>(grdWeek, 0,

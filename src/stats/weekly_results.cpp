@@ -39,16 +39,18 @@ void WeeklyResults::AddResult(const ResultView& result) {
   if (result.GameDate() != date_ || result.Team() != team_) return;
   nights_.push_back(
       {result.ID(), result.IsForfeit(), RowOf(result), std::string(result.Opposition())});
-  names_.try_emplace(result.ID());
+  if (ids_.Add(result.ID()) == static_cast<int>(names_.size())) names_.emplace_back();
 }
 
 void WeeklyResults::AddPlayer(const PlayerView& player) {
-  const auto place = names_.find(player.ID());
-  if (place != names_.end() && !place->second) place->second = player.FullName(", ");
+  const int place = ids_.Find(player.ID());
+  if (place == IdIndex::kNone) return;
+  auto& name = names_[static_cast<std::size_t>(place)];
+  if (!name) name = player.FullName(", ");
 }
 
 const std::string* WeeklyResults::NameOf(std::int32_t id) const {
-  const auto& name = names_.at(id);
+  const auto& name = names_[static_cast<std::size_t>(ids_.Find(id))];
   return name ? &*name : nullptr;
 }
 

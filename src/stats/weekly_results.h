@@ -5,11 +5,11 @@
 #include <optional>
 #include <string>
 #include <string_view>
-#include <unordered_map>
 #include <vector>
 
 #include "data/records.h"
 #include "data/side_file.h"
+#include "stats/id_index.h"
 
 namespace marlowbeck {
 
@@ -54,13 +54,14 @@ class WeeklyResults {
     std::string opposition;
   };
 
+  /// Null where the player is in the file no more.
   [[nodiscard]] const std::string* NameOf(std::int32_t id) const;
 
   std::string_view team_;
   Date date_;
   std::vector<Night> nights_;
-  /// The ids that played, with their names once they have been found.
-  std::unordered_map<std::int32_t, std::optional<std::string>> names_;
+  IdIndex ids_;                                    ///< those that played
+  std::vector<std::optional<std::string>> names_;  ///< in their places, once they have been found
 };
 
 /// The hand-over to the grid, two lines a row and no count: name, agg, shots, c180, c100 and hs,

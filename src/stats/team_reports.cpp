@@ -1,0 +1,70 @@
+#include "stats/team_reports.h"
+
+#include "data/competition.h"
+#include "stats/team_dates.h"
+
+namespace marlowbeck {
+namespace {
+
+constexpr const char* kWeeklyFile = "weekly.qz3";
+constexpr const char* kProgressiveFile = "progweek.qz3";
+
+template <typename Take>
+void ReadPlayers(Session& session, Channels& channels, Take take) {
+  OpenFile(session, channels);
+  channels.ForEachRecord(Channel::Players, [&](Bytes bytes, int) { take(PlayerView(bytes)); });
+  channels.Close(Channel::Players);
+}
+
+template <typename Take>
+void ReadResults(Session& session, Channels& channels, Take take) {
+  OpenResultSFile(session, channels);
+  channels.ForEachRecord(Channel::Results, [&](Bytes bytes, int) { take(ResultView(bytes)); });
+  channels.Close(Channel::Results);
+}
+
+}  // namespace
+
+void CalcWeekly(Session& session, Channels& channels) {
+  WeeklyResults weekly(session.Team, session.WorkDate);
+  ReadResults(session, channels, [&](const ResultView& result) { weekly.AddResult(result); });
+  ReadPlayers(session, channels, [&](const PlayerView& player) { weekly.AddPlayer(player); });
+  if (const auto opposition = weekly.Opposition()) session.Opposition = *opposition;
+  const std::vector<WeeklyRow> rows = weekly.Rows();
+  session.RowCount = static_cast<int>(rows.size());
+  channels.OpenOutput(Channel::Side, kWeeklyFile, Keeping::Working);
+  WriteWeekly(channels.Writer(Channel::Side), rows);
+  channels.CloseAll();
+}
+
+std::vector<WeeklyRow> ReadWeeklyFile(const Session& session, Channels& channels) {
+  channels.OpenInput(Channel::Side, kWeeklyFile);
+  std::vector<WeeklyRow> rows = ReadWeekly(channels.Reader(Channel::Side), session.RowCount);
+  channels.CloseAll();
+  return rows;
+}
+
+std::vector<ProgressiveRow> CalcProg(Session& session, Channels& channels) {
+  session.RowCount = 0;
+  ProgressiveDetails details(session.Team, session.Grade, session.WorkDate);
+  ReadPlayers(session, channels, [&](const PlayerView& player) { details.AddPlayer(player); });
+  ReadResults(session, channels, [&](const ResultView& result) { details.AddResult(result); });
+  std::vector<ProgressiveRow> rows = details.Rows();
+  session.RowCount = static_cast<int>(rows.size());
+  channels.OpenOutput(Channel::Side, kProgressiveFile, Keeping::Working);
+  WriteProgressive(channels.Writer(Channel::Side), rows);
+  channels.CloseAll();
+  return rows;
+}
+
+void GetDates(Session& session, Channels& channels) {
+  session.TeamDates.clear();
+  session.DateCount = 0;
+  TeamDates dates(session.Team);
+  ReadResults(session, channels, [&](const ResultView& result) { dates.AddResult(result); });
+  channels.CloseAll();
+  session.TeamDates = dates.Sorted();
+  session.DateCount = static_cast<int>(session.TeamDates.size());
+}
+
+}  // namespace marlowbeck

@@ -46,10 +46,11 @@ void CalcWeeklyAndCalcProg(benchmark::State& state) {
   files.ChangeFolder(InOrder().Folder());
   Channels channels(files);
   Session session = TeamSession();
+  TeamReports reports;
   for (auto _ : state) {
-    CalcWeekly(session, channels);
+    reports.CalcWeekly(session, channels);
     if (session.RowCount == 0) state.SkipWithError("no rows");
-    benchmark::DoNotOptimize(CalcProg(session, channels));
+    benchmark::DoNotOptimize(reports.CalcProg(session, channels));
   }
 }
 BENCHMARK(CalcWeeklyAndCalcProg)->Unit(benchmark::kMicrosecond)->UseRealTime();

@@ -13,6 +13,15 @@ std::optional<bool> ValueOf(const Control& control) {
   return std::nullopt;
 }
 
+/// Brings a picture to the height of the control that it stands beside.
+void MoveBeside(QWidget& picture, const Control& control) {
+  const auto* const other = picture.window()->findChild<QWidget*>(ObjectNameOf(control));
+  if (other == nullptr) return;
+  const QPoint centre = other->mapTo(picture.window(), other->rect().center());
+  const int height = picture.parentWidget()->mapFrom(picture.window(), centre).y();
+  picture.move(picture.x(), height - picture.height() / 2);
+}
+
 }  // namespace
 
 void PanelView::ShowKind() {
@@ -73,6 +82,8 @@ void ButtonView::ShowKind() {
   if (const auto value = ValueOf(GetControl())) button_.setChecked(*value);
   if (auto* const picture = qobject_cast<PictureButton*>(&button_)) {
     picture->SetBordered(GetControl().Bordered());
+    const Control* const beside = static_cast<const Picture&>(GetControl()).Beside();
+    if (beside != nullptr) MoveBeside(*picture, *beside);
   }
 }
 

@@ -3,7 +3,7 @@
 #include <array>
 #include <vector>
 
-#include "stats/progressive_details.h"
+#include "stats/team_reports.h"
 #include "ui/context.h"
 #include "ui/controls.h"
 #include "ui/screen.h"
@@ -121,6 +121,7 @@ struct frmPMenu : Screen {
 
   const Context& context_;
   Session& session_;
+  TeamReports reports_;
   std::vector<ProgressiveRow> progressive_;  ///< the rows of the last CalcProg
 };
 

@@ -3,14 +3,13 @@
 #include "session/forfeits_choice.h"
 #include "stats/frmPMenu.h"
 #include "stats/grid_rows.h"
-#include "stats/team_reports.h"
 
 namespace marlowbeck {
 
 void frmPMenu::CalcProg() {
   progressive_.clear();
   context_.GoToWorkingFolder();
-  progressive_ = marlowbeck::CalcProg(session_, context_.channels);
+  progressive_ = reports_.CalcProg(session_, context_.channels);
 }
 
 void frmPMenu::GridProg() {

@@ -12,7 +12,6 @@ namespace marlowbeck {
 
 void ProgressiveDetails::AddPlayer(const PlayerView& player) {
   if (player.Team() != team_ || player.Grade() != grade_) return;
-  if (players_.size() >= kReportPlaces) throw RunTimeError(ErrorNumber::SubscriptOutOfRange);
   players_.emplace_back(player.FullName(", "), player.ID());
   if (ids_.Add(player.ID()) == static_cast<int>(sums_.size())) sums_.emplace_back();
 }

@@ -36,15 +36,18 @@ struct ProgressiveRow {
 /// and answers the rows. A result counts for its player whatever team it names.
 class ProgressiveDetails {
  public:
-  /// `team` and `grade` must outlive this.
   ProgressiveDetails(std::string_view team, std::string_view grade, Date until)
       : team_(team), grade_(grade), until_(until) {}
 
-  /// Throws SubscriptOutOfRange past 1000 players of the team.
+  [[nodiscard]] bool IsFor(std::string_view team, std::string_view grade, Date until) const {
+    return team_ == team && grade_ == grade && until_ == until;
+  }
+
   void AddPlayer(const PlayerView& player);
   void AddResult(const ResultView& result);
 
   /// A row for each player record of the team, also without a result, best average first.
+  /// Throws SubscriptOutOfRange past 1000 players of the team.
   [[nodiscard]] std::vector<ProgressiveRow> Rows() const;
 
  private:
@@ -59,8 +62,8 @@ class ProgressiveDetails {
   static void CountPegs(ProgressiveRow& totals, const ResultView& result);
   [[nodiscard]] ProgressiveRow RowOf(const std::string& name, std::int32_t id) const;
 
-  std::string_view team_;
-  std::string_view grade_;
+  std::string team_;
+  std::string grade_;
   Date until_;
   std::vector<std::pair<std::string, std::int32_t>> players_;  ///< name and id
   IdIndex ids_;

@@ -1,5 +1,7 @@
 #include "stats/team_reports.h"
 
+#include <utility>
+
 #include "data/competition.h"
 #include "stats/team_dates.h"
 
@@ -25,9 +27,15 @@ void ReadResults(Session& session, Channels& channels, Take take) {
 
 }  // namespace
 
-void CalcWeekly(Session& session, Channels& channels) {
+void TeamReports::CalcWeekly(Session& session, Channels& channels) {
+  season_.reset();
   WeeklyResults weekly(session.Team, session.WorkDate);
-  ReadResults(session, channels, [&](const ResultView& result) { weekly.AddResult(result); });
+  ProgressiveDetails season(session.Team, session.Grade, session.WorkDate);
+  ReadPlayers(session, channels, [&](const PlayerView& player) { season.AddPlayer(player); });
+  ReadResults(session, channels, [&](const ResultView& result) {
+    weekly.AddResult(result);
+    season.AddResult(result);
+  });
   ReadPlayers(session, channels, [&](const PlayerView& player) { weekly.AddPlayer(player); });
   if (const auto opposition = weekly.Opposition()) session.Opposition = *opposition;
   const std::vector<WeeklyRow> rows = weekly.Rows();
@@ -35,6 +43,7 @@ void CalcWeekly(Session& session, Channels& channels) {
   channels.OpenOutput(Channel::Side, kWeeklyFile, Keeping::Working);
   WriteWeekly(channels.Writer(Channel::Side), rows);
   channels.CloseAll();
+  season_ = std::move(season);
 }
 
 std::vector<WeeklyRow> ReadWeeklyFile(const Session& session, Channels& channels) {
@@ -44,12 +53,15 @@ std::vector<WeeklyRow> ReadWeeklyFile(const Session& session, Channels& channels
   return rows;
 }
 
-std::vector<ProgressiveRow> CalcProg(Session& session, Channels& channels) {
+std::vector<ProgressiveRow> TeamReports::CalcProg(Session& session, Channels& channels) {
   session.RowCount = 0;
-  ProgressiveDetails details(session.Team, session.Grade, session.WorkDate);
-  ReadPlayers(session, channels, [&](const PlayerView& player) { details.AddPlayer(player); });
-  ReadResults(session, channels, [&](const ResultView& result) { details.AddResult(result); });
-  std::vector<ProgressiveRow> rows = details.Rows();
+  std::optional<ProgressiveDetails> season = std::exchange(season_, std::nullopt);
+  if (!season || !season->IsFor(session.Team, session.Grade, session.WorkDate)) {
+    season.emplace(session.Team, session.Grade, session.WorkDate);
+    ReadPlayers(session, channels, [&](const PlayerView& player) { season->AddPlayer(player); });
+    ReadResults(session, channels, [&](const ResultView& result) { season->AddResult(result); });
+  }
+  std::vector<ProgressiveRow> rows = season->Rows();
   session.RowCount = static_cast<int>(rows.size());
   channels.OpenOutput(Channel::Side, kProgressiveFile, Keeping::Working);
   WriteProgressive(channels.Writer(Channel::Side), rows);

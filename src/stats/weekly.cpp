@@ -104,7 +104,7 @@ void frmPMenu::CalcWeekly() {
   TakeSelection();
   session_.WorkDate = DateFromText(lstAllDates.Line(lstAllDates.Index()));
   context_.GoToWorkingFolder();
-  marlowbeck::CalcWeekly(session_, context_.channels);
+  reports_.CalcWeekly(session_, context_.channels);
 }
 
 void frmPMenu::GridWeekly() {

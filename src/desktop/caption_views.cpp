@@ -109,20 +109,23 @@ void MenuView::ReadKind(ControlState& state) const {
   state.caption = FromMnemonicText(action_.text());
 }
 
+/// An entry is there when its menu is, and a menu when its window is.
 void MenuView::ReadCommon(ControlState& state) const {
   state.visible = action_.isVisible();
   state.shown = state.visible;
   state.enabled = action_.isEnabled();
-  const QWidget* holder = static_cast<const QWidget*>(action_.parent());
-  if (const auto* const menu = qobject_cast<const QMenu*>(holder)) {
-    const bool is_menu_itself = menu->menuAction() == &action_;
-    state.shown = state.shown && (is_menu_itself || menu->menuAction()->isVisible());
-    state.enabled = state.enabled && menu->menuAction()->isEnabled();
+  for (QObject* holder : action_.associatedObjects()) {
+    if (const auto* const menu = qobject_cast<QMenu*>(holder)) {
+      state.shown = state.shown && menu->menuAction()->isVisible();
+      state.enabled = state.enabled && menu->menuAction()->isEnabled();
+    }
+    if (const auto* const widget = qobject_cast<QWidget*>(holder)) {
+      const QWidget* window = widget;
+      while (window->parentWidget() != nullptr) window = window->parentWidget();
+      state.shown = state.shown && window->isVisible();
+      state.enabled = state.enabled && window->isEnabled();
+    }
   }
-  // The window that the menu bar is on.
-  while (holder != nullptr && holder->parentWidget() != nullptr) holder = holder->parentWidget();
-  state.shown = state.shown && holder != nullptr && holder->isVisible();
-  state.enabled = state.enabled && holder != nullptr && holder->isEnabled();
 }
 
 void ProgressView::ShowKind() {

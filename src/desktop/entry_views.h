@@ -57,7 +57,6 @@ class ComboView : public CaptionedView {
 class DateView : public CaptionedView {
  public:
   DateView(DatePicker& control, QDateEdit* box, Windows& windows);
-  [[nodiscard]] bool KeepsArrows() const override { return true; }
   void FinishTyping() override { box_.interpretText(); }
 
  protected:

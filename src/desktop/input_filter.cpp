@@ -133,7 +133,10 @@ bool InputFilter::CommonKey(const QKeyEvent& event, const View* view) {
     return true;
   }
   const char letter = AltLetter(event);
-  windows_.DoByKey([&](Hand& hand) { return hand.PressMnemonic(letter); });
+  windows_.DoByKey([&](Hand& hand) {
+    hand.CloseMenu();  // while one is down, the keys are its own
+    return hand.PressMnemonic(letter);
+  });
   if (ScreenWindow* const front = windows_.Front()) {
     for (const Control* control : front->GetScreen().Controls()) {
       if (!IsMenuMnemonic(*control, letter)) continue;
@@ -211,13 +214,12 @@ bool InputFilter::MouseMove(const QObject& watched, ScreenWindow& window,
     windows_.Do(nullptr, [&](Hand& hand) { return hand.HoverScreen(window.GetScreen()); });
     return true;
   }
-  // Lists and grids need the pointer themselves, for the tips and edges of their headers.
-  if (dynamic_cast<const QAbstractScrollArea*>(view->Widget()) != nullptr) return false;
   Control& control = view->GetControl();
   if (control.MouseMove) {
     windows_.Do(nullptr, [&](Hand& hand) { return hand.Hover(control); });
   }
-  return true;
+  // Lists and grids need the pointer themselves, for the edges of their headers.
+  return dynamic_cast<const QAbstractScrollArea*>(view->Widget()) == nullptr;
 }
 
 }  // namespace marlowbeck

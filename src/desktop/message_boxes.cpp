@@ -14,6 +14,8 @@
 namespace marlowbeck {
 namespace {
 
+constexpr const char* kTopic = "topic";
+
 struct Look {
   BoxStyle style;
   QMessageBox::Icon icon;
@@ -110,6 +112,7 @@ InputDialog::InputDialog(const InputBoxRequest& request, QWidget* parent,
   if (request.help_topic) {
     help_ = new QPushButton("Help", this);
     help_->setAutoDefault(false);
+    help_->setProperty(kTopic, *request.help_topic);
     connect(help_, &QPushButton::clicked, this, [=] { help(*request.help_topic); });
     buttons->addWidget(help_);
   }
@@ -123,6 +126,10 @@ InputDialog::InputDialog(const InputBoxRequest& request, QWidget* parent,
   column->addWidget(entry_);
   column->addLayout(buttons);
   entry_->setFocus();
+}
+
+std::optional<int> InputDialog::HelpTopic() const {
+  return help_ == nullptr ? std::nullopt : std::optional(help_->property(kTopic).toInt());
 }
 
 MessageBoxes::MessageBoxes(std::function<void()> before, std::function<void(int topic)> help)

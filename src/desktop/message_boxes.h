@@ -1,6 +1,7 @@
 #pragma once
 
 #include <functional>
+#include <optional>
 
 #include <QDialog>
 #include <QLabel>
@@ -21,7 +22,8 @@ class InputDialog : public QDialog {
   [[nodiscard]] QLineEdit& Entry() const { return *entry_; }
   [[nodiscard]] QPushButton& OkButton() const { return *ok_; }
   [[nodiscard]] QPushButton& CancelButton() const { return *cancel_; }
-  [[nodiscard]] QPushButton* HelpButton() const { return help_; }
+  /// Of the Help button; nothing where there is none.
+  [[nodiscard]] std::optional<int> HelpTopic() const;
 
  private:
   QLabel* prompt_;

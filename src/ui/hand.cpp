@@ -57,6 +57,7 @@ void AssignText(Control& control, std::string_view text) {
 }  // namespace
 
 Outcome Hand::Whole(const Handler& action) {
+  CloseMenu();
   screens_.GetDispatcher().Run(action);
   screens_.Settle();
   return {};
@@ -258,7 +259,6 @@ Outcome Hand::Press(Key key) {
   Screen* const front = screens_.Front();
   if (front == nullptr) return {"no screen is in front", false};
   if (!front->Enabled()) return {front->Name() + " is disabled", false};
-  open_menu_ = nullptr;
   return Whole([&] { PressOn(front->Focus(), *front, key); });
 }
 

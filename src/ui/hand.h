@@ -51,6 +51,8 @@ class Hand {
   Outcome Press(Key key);
   /// The mnemonic of a letter: the command with it, or a menu, and then an entry of that menu.
   Outcome PressMnemonic(char letter);
+  /// The menu that a mnemonic dropped down has gone again.
+  void CloseMenu() { open_menu_ = nullptr; }
   Outcome Focus(Control& control);
   Outcome Hover(Control& control);
   Outcome HoverScreen(Screen& screen);

@@ -1,0 +1,65 @@
+#include "desktop/scripted/gestures.h"
+
+#include <QApplication>
+#include <QKeyEvent>
+#include <QMouseEvent>
+#include <QPointer>
+
+namespace marlowbeck {
+namespace {
+
+void SendMouse(QWidget& widget, QEvent::Type type, QPoint at, Qt::MouseButton button,
+               Qt::MouseButtons held, Qt::KeyboardModifiers modifiers) {
+  QMouseEvent event(type, at, widget.mapToGlobal(QPointF(at)), button, held, modifiers);
+  QApplication::sendEvent(&widget, &event);
+}
+
+}  // namespace
+
+void PressMouse(QWidget& widget, QPoint at, Qt::KeyboardModifiers modifiers) {
+  SendMouse(widget, QEvent::MouseButtonPress, at, Qt::LeftButton, Qt::LeftButton, modifiers);
+}
+
+void ReleaseMouse(QWidget& widget, QPoint at, Qt::KeyboardModifiers modifiers) {
+  SendMouse(widget, QEvent::MouseButtonRelease, at, Qt::LeftButton, Qt::NoButton, modifiers);
+}
+
+/// What is pressed may have gone by the time that the button is up.
+void ClickMouse(QWidget& widget, QPoint at, Qt::KeyboardModifiers modifiers) {
+  const QPointer<QWidget> still_there(&widget);
+  PressMouse(widget, at, modifiers);
+  if (still_there) ReleaseMouse(widget, at, modifiers);
+}
+
+void ClickMouseAgain(QWidget& widget, QPoint at) {
+  const QPointer<QWidget> still_there(&widget);
+  SendMouse(widget, QEvent::MouseButtonDblClick, at, Qt::LeftButton, Qt::LeftButton,
+            Qt::NoModifier);
+  if (still_there) ReleaseMouse(widget, at);
+}
+
+void MoveMouse(QWidget& widget, QPoint at) {
+  SendMouse(widget, QEvent::MouseMove, at, Qt::NoButton, Qt::NoButton, Qt::NoModifier);
+}
+
+void PressKey(QWidget& widget, int key, Qt::KeyboardModifiers modifiers, const QString& text) {
+  const QPointer<QWidget> still_there(&widget);
+  QKeyEvent press(QEvent::KeyPress, key, modifiers, text);
+  QApplication::sendEvent(&widget, &press);
+  if (!still_there) return;
+  QKeyEvent release(QEvent::KeyRelease, key, modifiers, text);
+  QApplication::sendEvent(&widget, &release);
+}
+
+void TypeOver(QWidget& entry, const QString& text) {
+  PressKey(entry, Qt::Key_A, Qt::ControlModifier);
+  if (text.isEmpty()) PressKey(entry, Qt::Key_Delete);
+  for (const QChar letter : text) PressKey(entry, 0, Qt::NoModifier, letter);
+}
+
+void SettleEvents() {
+  QApplication::processEvents();
+  QApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
+}
+
+}  // namespace marlowbeck

@@ -1,6 +1,7 @@
 #include "desktop/list_view.h"
 
 #include <QScrollBar>
+#include <QTimer>
 
 #include "desktop/encoding.h"
 
@@ -14,11 +15,20 @@ ListView::ListView(ListBox& control, QListWidget* list, Windows& windows)
   list_.setEditTriggers(QAbstractItemView::NoEditTriggers);
 }
 
+/// A list that has just come up gets its size later, and has to be scrolled once more then.
+void ListView::BringIntoSight(int line) {
+  const auto scroll = [this, line] {
+    if (line < list_.count()) list_.scrollToItem(list_.item(line));
+  };
+  scroll();
+  QTimer::singleShot(0, this, scroll);
+}
+
 void ListView::ShowKind() {
   ShowLines();
   ShowMarks();
   const int line = CurrentLine();
-  if (line >= 0 && line != shown_line_) list_.scrollToItem(list_.item(line));
+  if (line >= 0 && line != shown_line_) BringIntoSight(line);
   shown_line_ = line;
   list_.setAccessibleDescription(model_.GetKind() == Kind::Folders ||
                                          model_.GetKind() == Kind::Files

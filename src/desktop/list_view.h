@@ -20,6 +20,7 @@ class ListView : public CaptionedView {
   void ReadKind(ControlState& state) const override;
 
  private:
+  void BringIntoSight(int line);
   void ShowLines();
   void ShowMarks();
   void PressLine(int line, Qt::KeyboardModifiers modifiers);

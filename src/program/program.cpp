@@ -1,5 +1,6 @@
 #include "program/program.h"
 
+#include <cstdint>
 #include <utility>
 
 namespace marlowbeck {
@@ -27,7 +28,7 @@ void Program::GiveUpEvent() {
 
 void Program::ReportError(int number) {
   channels_.AbandonAll();
-  session_.ErrorNumber = Integer::Narrow(number);
+  session_.ErrorNumber = static_cast<std::int16_t>(number);
   platform_.observer.ErrorRaised(number);
   if (Screen* const errors = screens_.ShowQuietly("frmErrors")) errors->Activate();
 }

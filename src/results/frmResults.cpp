@@ -1,5 +1,7 @@
 #include "results/frmResults.h"
 
+#include <utility>
+
 #include "data/competition.h"
 #include "ui/screens.h"
 
@@ -63,6 +65,8 @@ void frmResults::Load() {
 void frmResults::Activate() {
   // What another screen has left in it is no failed check of this one.
   context_.session.Flag = 0;
+  // The setup may have added grades and teams, and the main menu opened another competition.
+  if (std::exchange(away_in_setup_, false)) Start();
 }
 
 void frmResults::HelpKey() { OpenHelp(); }

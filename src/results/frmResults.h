@@ -189,6 +189,7 @@ struct frmResults : Screen {
   void OpenHelp();
 
   const Context& context_;
+  bool away_in_setup_ = false;  ///< gone to add a team that the grade lacks
   /// The one record buffer of the screen, in which readings of the results file leave their last
   /// record; it is always read anew, if there is anything to read, before a sheet opens.
   ResultRecord record_;

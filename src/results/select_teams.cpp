@@ -92,6 +92,7 @@ void frmResults::OfferMoreTeams() {
                        "Do you wish to add more teams now ?"}));
   if (answer == kAnswerNo || !InScreens().Knows("frmNames")) return;
   context_.session.Flag = 1;
+  away_in_setup_ = true;
   InScreens().Hide(*this);
   InScreens().Show("frmNames");
 }

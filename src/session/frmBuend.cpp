@@ -37,7 +37,7 @@ void frmBuend::Escape() { Quit(); }
 
 void frmBuend::Quit() {
   context_.channels.CloseAll();
-  context_.GoToWorkingFolder();
+  GoToWorkingFolderIfThere(context_);
   EndProgram(context_, InScreens());
 }
 

@@ -65,6 +65,7 @@ void frmDB::WireMenus() {
   mnuAssociation.Click = [this] { mnuAssociation_Click(); };
   mnuHelpIndex.Click = [this] { HelpKey(); };
   mnuAbout.Click = [this] {
+    Menus();
     InScreens().Hide(*this);
     InScreens().Show("frmAbout");
   };

@@ -97,7 +97,8 @@ struct frmDB : Screen {
   void CreateFile(const std::string& path, const std::string& carry_over_source);
   void CarryOver(const std::string& source);
   void AfterCreation();
-  void FileNotFound(const std::string& file_before);
+  void WithOwnWords(const Handler& work);
+  void NewCompetition();
   void ReopenNamedFile();
 
   [[nodiscard]] bool FirstGradeHasTwoTeams();

@@ -24,8 +24,7 @@ std::string AskForFile(const Context& context, FileDialogRequest::Mode mode, con
 }  // namespace
 
 void frmDB::mnuOpen_Click() {
-  const std::string file_before = session_.PlayerFile;
-  try {
+  WithOwnWords([this] {
     const std::string path =
         AskForFile(context_, FileDialogRequest::Mode::Open, "[Marlowbeck] OPEN file.");
     if (path.empty()) return;
@@ -35,19 +34,32 @@ void frmDB::mnuOpen_Click() {
     FileMenuState();
     context_.channels.CloseAll();
     GetPlayerFileName();
+  });
+}
+
+/// A path that leads nowhere has words of its own. The competition that the side file names is the
+/// open one again, whatever had been done up to the failure.
+void frmDB::WithOwnWords(const Handler& work) {
+  const std::string file_before = session_.PlayerFile;
+  const Integer count_before = session_.PlayerCount;
+  try {
+    work();
   } catch (const RunTimeError&) {
-    FileNotFound(file_before);
+    context_.channels.AbandonAll();
+    session_.PlayerFile = file_before;
+    session_.PlayerCount = count_before;
+    Warning(context_,
+            Lines({"The file name specified could    ", "not be found. Please retry.    "}),
+            Beep::First);
+    ReopenNamedFile();
   }
 }
 
-void frmDB::FileNotFound(const std::string& file_before) {
-  context_.channels.AbandonAll();
-  session_.PlayerFile = file_before;
-  Warning(context_, Lines({"The file name specified could    ", "not be found. Please retry.    "}),
-          Beep::First);
+void frmDB::mnuNew_Click() {
+  WithOwnWords([this] { NewCompetition(); });
 }
 
-void frmDB::mnuNew_Click() {
+void frmDB::NewCompetition() {
   context_.GoToWorkingFolder();
   std::string carry_over_source;
   if (!session_.PlayerFile.empty() && session_.PlayerCount > 0 && AskCarryOver()) {
@@ -99,27 +111,20 @@ std::string frmDB::AskForNewName() {
 }
 
 void frmDB::CreateFile(const std::string& path, const std::string& carry_over_source) {
-  try {
-    session_.PlayerFile = path;
-    OpenPlayerFile();
-    const bool was_there = session_.PlayerCount > 0;
-    if (!was_there && !carry_over_source.empty()) CarryOver(carry_over_source);
-    // Only a file that could be made, and that is whole, becomes the open one.
-    WriteFileName(context_);
-    if (was_there) {
-      Warning(context_, Lines({"The file you are trying to create    ", "already exists.    "}),
-              Beep::First);
-      context_.channels.CloseAll();
-      return GetPlayerFileName();
-    }
-    AfterCreation();
-  } catch (const RunTimeError&) {
-    FileNotFound({});
-    ReopenNamedFile();
-  }
+  session_.PlayerFile = path;
+  OpenPlayerFile();
+  const bool was_there = session_.PlayerCount > 0;
+  if (!was_there && !carry_over_source.empty()) CarryOver(carry_over_source);
+  // Only a file that could be made, and that is whole, becomes the open one.
+  WriteFileName(context_);
+  if (!was_there) return AfterCreation();
+  Warning(context_, Lines({"The file you are trying to create    ", "already exists.    "}),
+          Beep::First);
+  context_.channels.CloseAll();
+  GetPlayerFileName();
 }
 
-/// The file that was closed in memory comes back; nothing is said where there was none.
+/// Nothing more is said where there is none.
 void frmDB::ReopenNamedFile() {
   try {
     ReadFileName(context_);

@@ -95,6 +95,7 @@ void frmDB::imgbackup_Click() {
 }
 
 void frmDB::mnuFix_Click() {
+  Menus();
   for (;;) {
     const std::string reply = context_.platform.boxes.Input(
         {Lines({"Accepted range for this fixture", "generator is from 3 to 50.", "", "",
@@ -114,6 +115,7 @@ void frmDB::mnuFix_Click() {
 }
 
 void frmDB::mnuSearchPlayer_Click() {
+  Menus();
   const std::string reply =
       context_.platform.boxes.Input({"Enter SURNAME to Search for.", "Name Search", {}, {}});
   if (Trimmed(reply).empty() || !InScreens().Knows("frmSearchPlayer")) return;
@@ -126,7 +128,8 @@ void frmDB::mnuSearchPlayer_Click() {
 void frmDB::mnuAssociation_Click() { AskAssociationName(context_); }
 
 void frmDB::Leave() {
-  context_.GoToWorkingFolder();
+  Menus();
+  GoToWorkingFolderIfThere(context_);
   InScreens().Hide(*this);
   InScreens().Show("frmBuend");
 }

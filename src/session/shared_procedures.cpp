@@ -122,6 +122,14 @@ void nofile(const Context& context, Screens& screens, Beep beep) {
           beep);
 }
 
+void GoToWorkingFolderIfThere(const Context& context) {
+  try {
+    context.GoToWorkingFolder();
+  } catch (const RunTimeError&) {
+    context.channels.AbandonAll();
+  }
+}
+
 void EndProgram(const Context& context, Screens& screens) {
   context.channels.CloseAll();
   screens.End();

@@ -36,6 +36,9 @@ void WriteFileName(const Context& context);
 /// Tells that no competition is open, on the main menu and in a box.
 void nofile(const Context& context, Screens& screens, Beep beep);
 
+/// The way out must not depend on a folder that may have gone.
+void GoToWorkingFolderIfThere(const Context& context);
+
 /// The end of the program: what runs now is the last thing that it does.
 void EndProgram(const Context& context, Screens& screens);
 

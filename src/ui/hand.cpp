@@ -239,7 +239,7 @@ Outcome Hand::Focus(Control& control) {
 }
 
 Outcome Hand::Hover(Control& control) {
-  if (!control.Shown()) return Refused(control, "is hidden");
+  if (const Outcome check = CheckLive(control); !check.Done()) return check;
   if (!control.MouseMove) return {};
   return Whole([&] { control.Fire(control.MouseMove); });
 }

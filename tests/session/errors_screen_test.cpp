@@ -32,6 +32,12 @@ TEST_F(ErrorPath, UnknownNumberHasWordsOfItsOwn) {
   EXPECT_EQ(BoxTexts(), (std::vector<std::string>{"AN UNRECOGNISED ERROR HAS OCCURED!    "}));
 }
 
+TEST_F(ErrorPath, NumberIsNarrowedToSixteenBits) {
+  DoAll({"fault open 1 65542", "click imgLadder"});
+  EXPECT_EQ(BoxTexts(), (std::vector<std::string>{"OVERFLOW    "}));
+  EXPECT_EQ(InSession("ErrorNumber"), 6);
+}
+
 TEST_F(ErrorPath, SpellingStaysAsItIs) {
   DoAll({"fault open 1 18", "click imgLadder"});
   EXPECT_EQ(BoxTexts(), (std::vector<std::string>{"USER INTERUPRT OCCURED    "}));

@@ -472,6 +472,41 @@ TEST_F(MainMenu, MnemonicsReachTheEntriesOfAMenu) {
   EXPECT_EQ(Front(), "frmAbout");
 }
 
+TEST_F(MainMenu, EveryCommandTakesTheStatusLineAway) {
+  OpenTwoTeams();
+  for (const char* command : {"click mnuFix", "click mnuSearchPlayer", "click imgLadder"}) {
+    DoAll({"hover frmDB", "hover imgPrinter", command});
+    EXPECT_FALSE(Shown("lblDescription")) << command;
+  }
+}
+
+TEST_F(MainMenu, DisabledCommandCannotBePointedAt) {
+  OpenAtStart({});
+  EXPECT_NE(Refused("hover imgSheets").find("imgSheets"), std::string::npos);
+}
+
+TEST_F(MainMenu, FailedOpenBringsTheOldCompetitionBackWhole) {
+  OpenTwoTeams();
+  WritePlayers("Other.qza", {Player(7, "Cole", "Sam", "Kings", "B Grade")});
+  DoAll({"file Other.qza", "fault rename 1 70", "click mnuOpen"});
+  EXPECT_EQ(BoxTexts(), (std::vector<std::string>{kNotFound}));
+  EXPECT_EQ(OpenFile(), InFolder("Winter.qza"));
+  EXPECT_EQ(InSession("PlayerCount"), 2);
+  EXPECT_EQ(Title("frmDB"), "[Marlowbeck] Filename: WINTER");
+  EXPECT_EQ(Caption("lblHMPlayers"), "2 Players Listed in File. ");
+}
+
+TEST_F(MainMenu, ProgramCanBeLeftWhenItsFolderHasGone) {
+  OpenTwoTeams();
+  Do("events");
+  HOLDS_FOR_MODELS_ALONE("only one face's folder is taken away");
+  std::filesystem::remove_all(Folder());
+  Do("click imgExit");
+  EXPECT_EQ(Front(), "frmBuend");
+  DoAll({"click optBU(1)", "click cmdAddSave0"});
+  EXPECT_EQ(Count("ended"), 1);
+}
+
 TEST_F(MainMenu, NewSurvivesAFailureOfTheSideFile) {
   OpenTwoTeams();
   DoAll({"answer yes", "file Summer.qza", "fault rename 2 61", "click mnuNew"});

@@ -1,11 +1,11 @@
 // What is kept on purpose is told once in the code, under its mark, and once in docs/kept.md.
 
-#include <gtest/gtest.h>
-
 #include <filesystem>
 #include <fstream>
 #include <set>
 #include <string>
+
+#include <gtest/gtest.h>
 
 namespace marlowbeck {
 namespace {

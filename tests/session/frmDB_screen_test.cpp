@@ -500,11 +500,13 @@ TEST_F(MainMenu, ProgramCanBeLeftWhenItsFolderHasGone) {
   OpenTwoTeams();
   Do("events");
   HOLDS_FOR_MODELS_ALONE("only one face's folder is taken away");
-  std::filesystem::remove_all(Folder());
+  const std::string away = Folder().string() + "-away";
+  std::filesystem::rename(Folder(), away);
   Do("click imgExit");
   EXPECT_EQ(Front(), "frmBuend");
   DoAll({"click optBU(1)", "click cmdAddSave0"});
   EXPECT_EQ(Count("ended"), 1);
+  std::filesystem::rename(away, Folder());
 }
 
 TEST_F(MainMenu, NewSurvivesAFailureOfTheSideFile) {

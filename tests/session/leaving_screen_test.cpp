@@ -5,7 +5,7 @@ namespace marlowbeck {
 namespace {
 
 /// The way out of the program.
-class Leaving : public ClubTest {
+class LeavingTheProgram : public ClubTest {
  protected:
   void SetUp() override {
     WritePlayers("Winter.qza", {Player(1, "Archer", "Jo", "Rovers", "A Grade"),
@@ -14,7 +14,7 @@ class Leaving : public ClubTest {
   }
 };
 
-TEST_F(Leaving, ReminderSaysWhatItRecommends) {
+TEST_F(LeavingTheProgram, ReminderSaysWhatItRecommends) {
   Do("click imgExit");
   EXPECT_EQ(Front(), "frmBuend");
   EXPECT_EQ(Title("frmBuend"), "[Marlowbeck]  BEFORE YOU QUIT");
@@ -32,7 +32,7 @@ TEST_F(Leaving, ReminderSaysWhatItRecommends) {
   EXPECT_EQ(Caption("lblEsc"), "Press \"Esc\" to Quit Marlowbeck");
 }
 
-TEST_F(Leaving, CaptionFollowsTheOption) {
+TEST_F(LeavingTheProgram, CaptionFollowsTheOption) {
   DoAll({"click imgExit", "click optBU(1)"});
   EXPECT_EQ(Caption("cmdAddSave0"), "Quit Now");
   Do("click optBU(0)");
@@ -40,13 +40,13 @@ TEST_F(Leaving, CaptionFollowsTheOption) {
   EXPECT_FALSE(Ticked("optBU(1)"));
 }
 
-TEST_F(Leaving, SecondOptionEndsTheProgram) {
+TEST_F(LeavingTheProgram, SecondOptionEndsTheProgram) {
   const Json answer = DoAll({"click imgExit", "click optBU(1)", "click cmdAddSave0"});
   EXPECT_EQ(Count("ended"), 1);
   EXPECT_EQ(answer["ended"], true);
 }
 
-TEST_F(Leaving, EveryWayOutLeadsToTheReminder) {
+TEST_F(LeavingTheProgram, EveryWayOutLeadsToTheReminder) {
   for (const char* way : {"click mnuExit", "close frmDB", "key Esc", "click imgExit"}) {
     Do(way);
     EXPECT_EQ(Front(), "frmBuend") << way;
@@ -57,7 +57,7 @@ TEST_F(Leaving, EveryWayOutLeadsToTheReminder) {
   }
 }
 
-TEST_F(Leaving, EscHidesWhatLedOutUntilTheMainMenuIsBack) {
+TEST_F(LeavingTheProgram, EscHidesWhatLedOutUntilTheMainMenuIsBack) {
   DoAll({"hover imgExit", "key Esc"});
   EXPECT_EQ(Get("frmDB.imgExit")["visible"], false);
   EXPECT_EQ(Get("frmDB.lblEsc")["visible"], false);
@@ -69,24 +69,24 @@ TEST_F(Leaving, EscHidesWhatLedOutUntilTheMainMenuIsBack) {
   EXPECT_EQ(Title("frmDB"), "[Marlowbeck] Filename: WINTER");
 }
 
-TEST_F(Leaving, EscOnTheReminderEndsTheProgram) {
+TEST_F(LeavingTheProgram, EscOnTheReminderEndsTheProgram) {
   DoAll({"click imgExit", "key Esc"});
   EXPECT_EQ(Count("ended"), 1);
 }
 
-TEST_F(Leaving, BackupOpensNothingUntilThereIsACopier) {
+TEST_F(LeavingTheProgram, BackupOpensNothingUntilThereIsACopier) {
   DoAll({"click imgExit", "click cmdAddSave0"});
   EXPECT_EQ(Front(), "frmBuend");
   EXPECT_EQ(Count("ended"), 0);
 }
 
-TEST_F(Leaving, HelpTellsAboutBackups) {
+TEST_F(LeavingTheProgram, HelpTellsAboutBackups) {
   DoAll({"click imgExit", "click cmdHelp"});
   EXPECT_EQ(EventsNamed("help").at(0)["file"], "qz1.HLP");
   EXPECT_EQ(EventsNamed("help").at(0)["topic"], 215);
 }
 
-TEST_F(Leaving, NothingIsWrittenOnTheWayOut) {
+TEST_F(LeavingTheProgram, NothingIsWrittenOnTheWayOut) {
   Start();
   const std::string before = File("FileName.qz3");
   DoAll({"click imgExit", "click optBU(1)", "click cmdAddSave0"});

@@ -48,7 +48,7 @@ ActionReader ControlAndLine(Verb verb) {
   return [verb](World& world, Arguments& arguments) {
     Action action = On(verb, TakeControl(arguments, world.GetScreens()));
     Arguments ahead = arguments;
-    if (ahead.Word("line").starts_with('=')) {
+    if (ahead.Word("a line").starts_with('=')) {
       const std::string text = arguments.Rest();
       action.numbers = {LineEqualTo(*action.control, text.substr(text.find('=') + 1))};
     } else {
@@ -75,7 +75,7 @@ ActionReader ControlAndCell(Verb verb) {
 
 Action ReadPickedDate(World& world, Arguments& arguments) {
   Action action = On(Verb::PickDate, TakeControl(arguments, world.GetScreens()));
-  action.date = arguments.Day("date");
+  action.date = arguments.Day("a date");
   return action;
 }
 
@@ -93,7 +93,7 @@ bool IsMnemonic(std::string_view word) {
 }
 
 Action ReadKey(World& /*world*/, Arguments& arguments) {
-  const std::string word = arguments.Word("key");
+  const std::string word = arguments.Word("a key");
   Action action;
   if (IsMnemonic(word)) {
     action.verb = Verb::Mnemonic;
@@ -110,7 +110,7 @@ Action ReadKey(World& /*world*/, Arguments& arguments) {
 }
 
 Action ReadHover(World& world, Arguments& arguments) {
-  const std::string name = arguments.Word("control or screen");
+  const std::string name = arguments.Word("a control or screen");
   Action action;
   action.screen = world.GetScreens().Find(name);
   action.verb = action.screen != nullptr ? Verb::HoverScreen : Verb::Hover;

@@ -34,14 +34,14 @@ std::optional<int> WholeNumber(std::string_view word) {
 }
 
 Arguments::Arguments(std::string_view line) : rest_(line) {
-  command_ = AtEnd() ? std::string() : Word("command");
+  command_ = AtEnd() ? std::string() : Word("a command");
 }
 
 bool Arguments::AtEnd() const { return WithoutLeadingBlanks(rest_).empty(); }
 
 std::string Arguments::Word(std::string_view what) {
   rest_ = WithoutLeadingBlanks(rest_);
-  if (rest_.empty()) Refuse("needs a " + std::string(what));
+  if (rest_.empty()) Refuse("needs " + std::string(what));
   const auto end = rest_.find(' ');
   const std::string word(rest_.substr(0, end));
   rest_ = end == std::string_view::npos ? std::string_view() : rest_.substr(end);

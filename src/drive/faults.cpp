@@ -15,7 +15,7 @@ std::optional<FileOperation> OperationOf(const std::string& word, const Argument
 }
 
 void Crash(World& world, Arguments& arguments) {
-  const auto operation = OperationOf(arguments.Word("operation"), arguments);
+  const auto operation = OperationOf(arguments.Word("an operation"), arguments);
   const int nth = arguments.Number("N", 1);
   arguments.Finish();
   world.Faults().CrashAt(operation, nth);
@@ -58,7 +58,7 @@ void Fail(World& world, Arguments& arguments, const std::string& word) {
 }
 
 void SetFault(World& world, Arguments& arguments, Json& answer) {
-  const std::string word = arguments.Word("operation, cut, crash, count or off");
+  const std::string word = arguments.Word("an operation, cut, crash, count or off");
   if (word == "crash") return Crash(world, arguments);
   if (word == "cut") return Cut(world, arguments);
   if (word == "count") return Count(world, arguments, answer);
@@ -68,7 +68,7 @@ void SetFault(World& world, Arguments& arguments, Json& answer) {
 }
 
 void SetClock(World& world, Arguments& arguments, Json& /*answer*/) {
-  const Date today = arguments.Day("date");
+  const Date today = arguments.Day("a date");
   arguments.Finish();
   world.clock.Set(today);
 }

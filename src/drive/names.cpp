@@ -24,11 +24,11 @@ Control& ControlNamed(const std::string& name, const Screens& screens) {
 }
 
 Screen& TakeScreen(Arguments& arguments, const Screens& screens) {
-  return ScreenNamed(arguments.Word("screen"), screens);
+  return ScreenNamed(arguments.Word("a screen"), screens);
 }
 
 Control& TakeControl(Arguments& arguments, const Screens& screens) {
-  return ControlNamed(arguments.Word("control"), screens);
+  return ControlNamed(arguments.Word("a control"), screens);
 }
 
 }  // namespace marlowbeck

@@ -54,7 +54,8 @@ void Describe(CLI::App& app, Words& words) {
       },
       "YYYY-MM-DD");
   app.add_option("--today", words.today, "the system clock's date")->check(is_date);
-  app.add_option("--seed", words.seed, "what the system timer gives the first time it is asked");
+  app.add_option("--seed", words.seed, "what the system timer gives the first time it is asked")
+      ->check(CLI::NonNegativeNumber);
   app.add_option("--screen-width", words.screen_width, "the screen's width in twips")
       ->check(CLI::PositiveNumber);
   app.add_flag("--window", words.window, "work the real windows");

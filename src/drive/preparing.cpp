@@ -11,7 +11,7 @@ constexpr std::array<std::pair<std::string_view, int>, 4> kButtons = {
     {{"ok", kAnswerOk}, {"cancel", kAnswerCancel}, {"yes", kAnswerYes}, {"no", kAnswerNo}}};
 
 void PrepareMessage(World& world, Arguments& arguments, Json& /*answer*/) {
-  const std::string word = arguments.Word("button: ok, cancel, yes or no");
+  const std::string word = arguments.Word("a button: ok, cancel, yes or no");
   arguments.Finish();
   for (const auto& [name, number] : kButtons) {
     if (name == word) return world.answers.messages.Add(number);

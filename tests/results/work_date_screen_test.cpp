@@ -115,9 +115,9 @@ TEST_F(WorkDate, ADateBeyondTheCalendarEndsInTheErrorBoxAndMovesNothing) {
   EXPECT_EQ(DateOf("Cal"), "2004-03-03");
 }
 
-class Leaving : public ScoreSheets {};
+class LeavingTheScoreSheets : public ScoreSheets {};
 
-TEST_F(Leaving, AFileInOrderLeadsToTheMainMenu) {
+TEST_F(LeavingTheScoreSheets, AFileInOrderLeadsToTheMainMenu) {
   WriteResults(kAResults, {Night(11, "Hawks", "Lions", 3), Night(12, "Hawks", "Lions", 3),
                            Night(11, "Hawks", "Cubs", 10)});
   OpenTeam("Hawks");
@@ -127,7 +127,7 @@ TEST_F(Leaving, AFileInOrderLeadsToTheMainMenu) {
   EXPECT_FALSE(HasFile("resfile.qz3"));
 }
 
-TEST_F(Leaving, AFileOutOfOrderIsSortedFirst) {
+TEST_F(LeavingTheScoreSheets, AFileOutOfOrderIsSortedFirst) {
   const std::vector<ResultRecord> results = {Night(11, "Hawks", "Lions", 10),
                                              Night(12, "Hawks", "Lions", 3),
                                              Night(13, "Hawks", "Lions", 10)};
@@ -141,7 +141,7 @@ TEST_F(Leaving, AFileOutOfOrderIsSortedFirst) {
       SameResults(File(kAResults), FileOf(std::vector{results[1], results[0], results[2]})));
 }
 
-TEST_F(Leaving, TheWindowsCloseButtonIsTheSame) {
+TEST_F(LeavingTheScoreSheets, TheWindowsCloseButtonIsTheSame) {
   WriteResults(kAResults, {Night(11, "Hawks", "Lions", 10), Night(12, "Hawks", "Lions", 3)});
   OpenTeam("Hawks");
   Do("close frmResults");
@@ -149,20 +149,20 @@ TEST_F(Leaving, TheWindowsCloseButtonIsTheSame) {
   EXPECT_EQ(Saved()[0].ID, 12);
 }
 
-TEST_F(Leaving, AnEmptyOrOneRecordFileIsNeverSorted) {
+TEST_F(LeavingTheScoreSheets, AnEmptyOrOneRecordFileIsNeverSorted) {
   WriteResults(kAResults, {Night(11, "Hawks", "Lions", 10)});
   OpenTeam("Hawks");
   Do("click cmdLeaveResults");
   EXPECT_FALSE(HasFile("resfile.qz3"));
 }
 
-TEST_F(Leaving, BeforeAGradeIsChosenMakesNoFile) {
+TEST_F(LeavingTheScoreSheets, BeforeAGradeIsChosenMakesNoFile) {
   DoAll({"click imgSheets", "close frmResults"});
   EXPECT_EQ(Front(), "frmDB");
   EXPECT_FALSE(HasFile(kAResults));
 }
 
-TEST_F(Leaving, AFailureLeavesNobodyWithoutAScreen) {
+TEST_F(LeavingTheScoreSheets, AFailureLeavesNobodyWithoutAScreen) {
   HOLDS_FOR_MODELS_ALONE("the faults of the disk are those of one face");
   OpenTeam("Hawks");
   Faults().FailAt(FileOperation::Open, 1, 57, false);

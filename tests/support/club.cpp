@@ -104,7 +104,7 @@ Json Club::Carry(std::string_view line, Here here) {
     const auto answer = house->driver->Answer(house->Named(line));
     if (!answer) {
       Fault(here, "\"" + std::string(line) + "\" has no answer");
-      return {};
+      return Json::object();
     }
     // The words of a refusal are each face's own.
     Json comparable = *answer;

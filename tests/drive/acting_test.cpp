@@ -1,0 +1,254 @@
+#include "drive/workbench.h"
+
+namespace marlowbeck {
+namespace {
+
+/// Counts what reaches the handlers of the workbench.
+class Acting : public WorkbenchTest {
+ protected:
+  Acting() {
+    prepare = [this](Workbench& made) {
+      for (Control* control : made.Controls()) {
+        if (control == &made.lblPlain || control == &made.fraPlain) continue;
+        control->Click = [this, control] { told += control->Name() + " clicked;"; };
+        control->DoubleClick = [this, control] { told += control->Name() + " doubly;"; };
+        control->Change = [this, control] { told += control->Name() + " changed;"; };
+        control->MouseMove = [this, control] { told += control->Name() + " hovered;"; };
+      }
+    };
+  }
+
+  /// Carries out a line and answers what the handlers were told by it.
+  std::string ToldBy(std::string_view line, Here here = Here::current()) {
+    told.clear();
+    Do(line, here);
+    return told;
+  }
+
+  std::string told;
+};
+
+TEST_F(Acting, ClickReachesEveryKindThatHasOne) {
+  for (const char* name : {"cmdDo", "fraClick", "lblClick", "imgShape", "mnuOpen"}) {
+    EXPECT_EQ(ToldBy(std::string("click ") + name), std::string(name) + " clicked;");
+  }
+}
+
+TEST_F(Acting, ClickTicksABoxAndChoosesAnOption) {
+  EXPECT_EQ(ToldBy("click chkTick"), "chkTick clicked;");
+  EXPECT_TRUE(Ticked("chkTick"));
+  ToldBy("click chkTick");
+  EXPECT_FALSE(Ticked("chkTick"));
+  EXPECT_EQ(ToldBy("click optBoth(1)"), "optBoth(1) clicked;");
+  EXPECT_TRUE(Ticked("optBoth(1)"));
+  Do("click optBoth(0)");
+  EXPECT_FALSE(Ticked("optBoth(1)"));
+}
+
+TEST_F(Acting, ClickIsRefusedWhereNobodyCouldClick) {
+  EXPECT_EQ(Refused("click lblPlain"), "lblPlain has no click");
+  EXPECT_EQ(Refused("click fraPlain"), "fraPlain has no click");
+  bench->cmdDo.Hide();
+  EXPECT_EQ(Refused("click cmdDo"), "cmdDo is hidden");
+  bench->cmdOff.Disable();
+  EXPECT_EQ(Refused("click cmdOff"), "cmdOff is disabled");
+  bench->fraPlain.Disable();
+  EXPECT_EQ(Refused("click optBoth(1)"), "optBoth(1) is disabled");
+  bench->fraPlain.Hide();
+  EXPECT_EQ(Refused("click optBoth(1)"), "optBoth(1) is hidden");
+  bench->SetEnabled(false);
+  EXPECT_EQ(Refused("click cmdHelp"), "cmdHelp is disabled");
+}
+
+TEST_F(Acting, DoubleClickComesAfterTheClickThatBelongsToIt) {
+  EXPECT_EQ(ToldBy("dblclick imgShape"), "imgShape clicked;imgShape doubly;");
+}
+
+TEST_F(Acting, TypeReplacesTheTextBlanksIncluded) {
+  EXPECT_EQ(ToldBy("type txtName  Jo  Archer "),
+            "txtName changed;txtName changed;txtName changed;txtName changed;txtName changed;"
+            "txtName changed;txtName changed;txtName changed;txtName changed;txtName changed;"
+            "txtName changed;txtName changed;");
+  EXPECT_EQ(Text("txtName"), " Jo  Archer ");
+  Do("type txtName Jo");
+  EXPECT_EQ(Text("txtName"), "Jo");
+  EXPECT_EQ(Focus(), "frmDB.txtName");
+}
+
+TEST_F(Acting, TypeAloneEmptiesTheBox) {
+  for (const char* line : {"type txtName", "type txtName "}) {
+    Do("type txtName Jo");
+    Do(line);
+    EXPECT_EQ(Text("txtName"), "");
+  }
+}
+
+TEST_F(Acting, TypeTakesLettersOfTheProgramsPage) {
+  Do("type txtName M\xC3\xBCller");
+  EXPECT_EQ(bench->txtName.Text(), "M\xFCller");
+  EXPECT_EQ(Text("txtName"), "M\xC3\xBCller");
+}
+
+TEST_F(Acting, TypeIsRefusedOnWhatIsLocked) {
+  EXPECT_EQ(Refused("type txtLocked x"), "txtLocked cannot be typed into");
+  EXPECT_EQ(Refused("type cboLocked x"), "cboLocked cannot be typed into");
+  EXPECT_EQ(Refused("type cmdDo x"), "cmdDo cannot be typed into");
+  Do("type cboFree second");
+  EXPECT_EQ(Text("cboFree"), "second");
+  EXPECT_EQ(Index("cboFree"), 1);
+}
+
+TEST_F(Acting, PickClicksALineByItsNumberOrItsText) {
+  for (const char* list : {"lstOne", "cboLocked", "drvDrives", "dirFolders", "filFiles"}) {
+    EXPECT_EQ(ToldBy("pick " + std::string(list) + " 2"), std::string(list) + " clicked;");
+    EXPECT_EQ(Index(list), 2);
+    EXPECT_EQ(ToldBy("pick " + std::string(list) + " =second"), std::string(list) + " clicked;");
+    EXPECT_EQ(Index(list), 1);
+  }
+}
+
+TEST_F(Acting, PickOfTheCurrentLineIsAClickLikeAnyOther) {
+  Do("pick lstOne 1");
+  EXPECT_EQ(ToldBy("pick lstOne 1"), "lstOne clicked;");
+}
+
+TEST_F(Acting, PickByTextTakesTheFirstEqualLineBlanksIncluded) {
+  Start();
+  for (const char* line : {"a  b ", " =c", "a  b "}) bench->lstOne.AddLine(line);
+  Do("pick lstOne =a  b ");
+  EXPECT_EQ(Index("lstOne"), 3);
+  Do("pick lstOne = =c");
+  EXPECT_EQ(Index("lstOne"), 4);
+  EXPECT_EQ(Refused("pick lstOne =a  b"), "lstOne has no line \"a  b\"");
+  EXPECT_EQ(Refused("pick lstOne =First"), "lstOne has no line \"First\"");
+}
+
+TEST_F(Acting, PickIsRefusedForALineThatIsNotThere) {
+  EXPECT_EQ(Refused("pick lstOne 3"), "lstOne has no such line");
+  EXPECT_EQ(Refused("pick cmdDo 0"), "cmdDo has no lines");
+  EXPECT_EQ(Refused("pick cmdDo =first"), "cmdDo has no lines");
+  EXPECT_EQ(Refused("pick lstOne -1"), "pick: the line must be at least 0");
+}
+
+TEST_F(Acting, SelectMarksJustTheseLines) {
+  Do("select lstMany 0 2");
+  EXPECT_EQ(Get("lstMany")["selected"], Json::parse("[0, 2]"));
+  Do("select lstMany 1");
+  EXPECT_EQ(Get("lstMany")["selected"], Json::parse("[1]"));
+  Do("select lstMany");
+  EXPECT_EQ(Get("lstMany")["selected"], Json::array());
+}
+
+TEST_F(Acting, SelectIsRefusedWhereOneLineIsMarkedOrNoneIsThere) {
+  EXPECT_EQ(Refused("select lstOne 0"), "lstOne marks one line only");
+  EXPECT_EQ(Refused("select lstMany 0 3"), "lstMany has no such line");
+  EXPECT_EQ(Refused("select lstMany x"), "select: needs a number for a line, not \"x\"");
+}
+
+TEST_F(Acting, DoublePickPicksFirst) {
+  EXPECT_EQ(ToldBy("dblpick lstOne 1"), "lstOne clicked;lstOne doubly;");
+  EXPECT_EQ(Index("lstOne"), 1);
+}
+
+TEST_F(Acting, CellClicksInAGridHeadingCountedIn) {
+  EXPECT_EQ(ToldBy("cell grdTable 1 2"), "grdTable clicked;");
+  EXPECT_EQ(Get("grdTable")["row"], 1);
+  EXPECT_EQ(Get("grdTable")["col"], 2);
+  EXPECT_EQ(ToldBy("dblcell grdTable 0 0"), "grdTable clicked;grdTable doubly;");
+  EXPECT_EQ(Refused("cell grdTable 2 0"), "grdTable has no such cell");
+  EXPECT_EQ(Refused("cell grdTable 0 3"), "grdTable has no such cell");
+  EXPECT_EQ(Refused("cell lstOne 0 0"), "lstOne has no cells");
+}
+
+TEST_F(Acting, AnotherDateFiresChangeAndTheSameOneNothing) {
+  EXPECT_EQ(ToldBy("date dtpDay 2004-04-07"), "dtpDay changed;");
+  EXPECT_EQ(DateOf("dtpDay"), "2004-04-07");
+  EXPECT_EQ(ToldBy("date dtpDay 2004-04-07"), "");
+  EXPECT_EQ(Refused("date txtName 2004-04-07"), "txtName has no date");
+}
+
+TEST_F(Acting, KeysGoToTheControlWithTheFocus) {
+  Do("focus txtName");
+  Do("key Tab");
+  EXPECT_EQ(Focus(), "frmDB.txtLocked");
+  Do("key Shift+Tab");
+  EXPECT_EQ(Focus(), "frmDB.txtName");
+  Do("key Enter");  // in an entry box a Tab
+  EXPECT_EQ(Focus(), "frmDB.txtLocked");
+  Do("focus cmdDo");
+  EXPECT_EQ(ToldBy("key Enter"), "cmdDo clicked;");
+  EXPECT_EQ(ToldBy("key F1"), "cmdHelp clicked;");
+  EXPECT_EQ(ToldBy("key Esc"), "cmdEnd clicked;");
+  Do("pick lstOne 0");
+  EXPECT_EQ(ToldBy("key Down"), "lstOne clicked;");
+  EXPECT_EQ(Index("lstOne"), 1);
+  Do("key Up");
+  EXPECT_EQ(Index("lstOne"), 0);
+}
+
+TEST_F(Acting, MnemonicsGoByTheirLetter) {
+  EXPECT_EQ(ToldBy("key Alt+D"), "cmdDo clicked;");
+  EXPECT_EQ(ToldBy("key Alt+d"), "cmdDo clicked;");
+  Do("key Alt+F");
+  EXPECT_EQ(ToldBy("key Alt+O"), "mnuOpen clicked;");
+  EXPECT_EQ(Refused("key Alt+Q"), "frmDB has no live mnemonic Q");
+}
+
+TEST_F(Acting, FocusGoesWhereItIsTaken) {
+  Do("focus cboFree");
+  EXPECT_EQ(Focus(), "frmDB.cboFree");
+  EXPECT_EQ(Refused("focus lblPlain"), "lblPlain takes no focus");
+}
+
+TEST_F(Acting, HoverReachesControlsAndTheBareScreen) {
+  EXPECT_EQ(ToldBy("hover imgShape"), "imgShape hovered;");
+  Do("hover frmDB");
+  EXPECT_EQ(Refused("hover frmShelf"), "frmDB has no control frmShelf");
+}
+
+TEST_F(Acting, CloseUsesTheWindowsButton) {
+  Start();
+  bench->InScreens().Show("frmShelf");
+  Do("close frmShelf");
+  EXPECT_FALSE(Loaded("frmShelf"));
+  EXPECT_EQ(Refused("close frmShelf"), "there is no screen frmShelf now");
+}
+
+TEST_F(Acting, IsLostWhenTheControlLeftShowsABox) {
+  Start();
+  bench->txtName.LostFocus = [this] {
+    bench->context.platform.boxes.Message({"Not so fast.", "T", BoxStyle::WarningOk});
+  };
+  for (const char* line : {"click cmdDo", "type cboFree x", "pick lstOne 1", "cell grdTable 1 1",
+                           "date dtpDay 2004-04-07", "select lstMany 1", "dblclick imgShape"}) {
+    Do("focus txtName");
+    told.clear();
+    const Json answer = Do(line);
+    EXPECT_EQ(answer.value("lost", false), true) << line;
+    EXPECT_EQ(Boxes().size(), 1U) << line;
+    EXPECT_EQ(told, "") << line;
+  }
+}
+
+TEST_F(Acting, IsLostWhenTheControlLeftCallsTheFocusBack) {
+  Do("focus txtName");
+  bench->txtName.LostFocus = [this] { bench->txtName.SetFocus(); };
+  EXPECT_EQ(Do("click cmdDo")["lost"], true);
+  EXPECT_EQ(Focus(), "frmDB.txtName");
+  EXPECT_EQ(told, "");
+}
+
+TEST_F(Acting, ThatIsNotLostSaysNothingOfIt) { EXPECT_FALSE(Do("click cmdDo").contains("lost")); }
+
+TEST_F(Acting, OnAScreenThatGoesWithTheClickIsSafe) {
+  Start();
+  auto* shelf = static_cast<Shelf*>(bench->InScreens().Show("frmShelf"));
+  shelf->cmdTake.Click = [shelf] { shelf->InScreens().Unload(*shelf); };
+  shelf->cmdTake.DoubleClick = [this] { told += "too late"; };
+  Do("dblclick cmdTake");
+  EXPECT_EQ(told, "");
+  EXPECT_EQ(Front(), "frmDB");
+}
+
+}  // namespace
+}  // namespace marlowbeck

@@ -2,6 +2,7 @@
 
 #include <QMenu>
 
+#include "data/text.h"
 #include "desktop/encoding.h"
 
 namespace marlowbeck {
@@ -22,6 +23,13 @@ void MoveBeside(QWidget& picture, const Control& control) {
   picture.move(picture.x(), height - picture.height() / 2);
 }
 
+/// A name may be filled up with blanks to the width of its field.
+void TakeNoRoomForBlanks(QLabel& label) {
+  QString text = label.text();
+  while (text.endsWith(' ')) text.chop(1);
+  label.setMaximumWidth(label.fontMetrics().horizontalAdvance(text + ' '));
+}
+
 }  // namespace
 
 void PanelView::ShowKind() {
@@ -31,7 +39,8 @@ void PanelView::ShowKind() {
   } else if (auto* const label = qobject_cast<QLabel*>(Widget())) {
     label->setTextFormat(Qt::PlainText);
     label->setText(ToQt(caption));
-    label->setAccessibleName(Spoken(caption));
+    label->setAccessibleName(Spoken(Trimmed(caption)));
+    if (label->frameShape() == QFrame::NoFrame) TakeNoRoomForBlanks(*label);
   } else {
     Widget()->setWindowTitle(ToQt(caption));  // nowhere to be seen, but there to be read
   }

@@ -54,6 +54,18 @@ class Style : public QProxyStyle {
     }
   }
 
+  void drawComplexControl(ComplexControl control, const QStyleOptionComplex* option,
+                          QPainter* painter, const QWidget* widget) const override {
+    const auto* const group = qstyleoption_cast<const QStyleOptionGroupBox*>(option);
+    if (group == nullptr || widget == nullptr || !widget->isEnabled()) {
+      return QProxyStyle::drawComplexControl(control, option, painter, widget);
+    }
+    QStyleOptionGroupBox own = *group;
+    const auto meaning = static_cast<Meaning>(widget->property(kMeaning).toInt());
+    own.palette.setColor(QPalette::WindowText, ColorOf(meaning));
+    QProxyStyle::drawComplexControl(control, &own, painter, widget);
+  }
+
   QIcon standardIcon(StandardPixmap icon, const QStyleOption* option,
                      const QWidget* widget) const override {
     switch (icon) {

@@ -10,6 +10,9 @@ namespace marlowbeck {
 
 // The one place that says how everything looks.
 
+/// The property of a widget that holds its Meaning as a number.
+inline constexpr const char* kMeaning = "meaning";
+
 /// Style, palette and type of the whole application.
 void ApplyTheme(QApplication& application);
 

@@ -1,15 +1,12 @@
 #include "desktop/view.h"
 
+#include <QGroupBox>
+
 #include "desktop/encoding.h"
 #include "desktop/theme.h"
 #include "desktop/windows.h"
 
 namespace marlowbeck {
-namespace {
-
-constexpr const char* kMeaning = "meaning";
-
-}  // namespace
 
 View::View(Control& control, QWidget* widget, Windows& windows)
     : control_(control), widget_(widget), windows_(windows) {
@@ -38,6 +35,9 @@ void View::ShowMeaning() {
   const Meaning meaning = control_.GetMeaning();
   if (widget_->property(kMeaning).toInt() == static_cast<int>(meaning)) return;
   widget_->setProperty(kMeaning, static_cast<int>(meaning));
+  // A panel's colour is that of its title alone, which the style paints: what lies in it keeps its
+  // own.
+  if (qobject_cast<QGroupBox*>(widget_) != nullptr) return widget_->update();
   QPalette palette = widget_->palette();
   for (const auto role : {QPalette::WindowText, QPalette::Text, QPalette::ButtonText}) {
     for (const auto group : {QPalette::Active, QPalette::Inactive}) {

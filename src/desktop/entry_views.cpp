@@ -47,10 +47,6 @@ ComboView::ComboView(ComboBox& control, QComboBox* box, Windows& windows)
           [this](int line) { Do([=, this](Hand& hand) { return hand.Pick(model_, line); }); });
 }
 
-QWidget* ComboView::FocusWidget() const {
-  return box_.isEditable() ? static_cast<QWidget*>(box_.lineEdit()) : &box_;
-}
-
 void ComboView::FocusCame() {
   if (box_.isEditable()) box_.lineEdit()->selectAll();
 }
@@ -81,12 +77,15 @@ void ComboView::ShowLines() {
 /// A locked combo may hold a text that is none of its lines; it stands where nothing is picked.
 void ComboView::ShowKind() {
   ShowEditable();
+  // Another current line would take the cursor out of what is being typed.
+  const int cursor = box_.isEditable() ? box_.lineEdit()->cursorPosition() : 0;
   ShowLines();
   if (box_.currentIndex() != model_.Index()) box_.setCurrentIndex(model_.Index());
   if (!box_.isEditable()) {
     box_.setPlaceholderText(ToQt(model_.Text()));
   } else if (FromQt(box_.currentText()) != model_.Text()) {
     box_.setEditText(ToQt(model_.Text()));
+    box_.lineEdit()->setCursorPosition(cursor);
   }
 }
 

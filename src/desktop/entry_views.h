@@ -39,7 +39,6 @@ class TextView : public CaptionedView {
 class ComboView : public CaptionedView {
  public:
   ComboView(ComboBox& control, QComboBox* box, Windows& windows);
-  [[nodiscard]] QWidget* FocusWidget() const override;
   void FocusCame() override;
 
  protected:

@@ -98,7 +98,7 @@ void ScreenWindow::PlaceFocus(bool anew) {
     if (QWidget* const left = window_->focusWidget()) left->clearFocus();
     return;
   }
-  QWidget* const target = view->FocusWidget();
+  QWidget* const target = view->Widget();
   const bool had_it = window_->focusWidget() == target;
   if (!had_it) target->setFocus(Qt::OtherFocusReason);
   if (!had_it || anew) view->FocusCame();

@@ -3,6 +3,7 @@
 #include <array>
 
 #include <QFontDatabase>
+#include <QPainter>
 #include <QPalette>
 #include <QProxyStyle>
 #include <QStyleFactory>
@@ -31,6 +32,11 @@ constexpr int kButtonHeight = 32;
 constexpr int kButtonWidth = 96;
 constexpr int kEntryHeight = 30;
 constexpr int kLineHeight = 24;
+constexpr int kCardTitleIndent = 24;
+
+bool IsCard(const QWidget* widget) {
+  return widget != nullptr && widget->property("role") == "card";
+}
 
 /// Fusion with our measures and our icons.
 class Style : public QProxyStyle {
@@ -80,6 +86,24 @@ class Style : public QProxyStyle {
       default:
         return QProxyStyle::standardIcon(icon, option, widget);
     }
+  }
+
+  /// A card is a panel that stands over others: filled, and framed all round with its title.
+  void drawComplexControl(ComplexControl control, const QStyleOptionComplex* option,
+                          QPainter* painter, const QWidget* widget) const override {
+    if (control == CC_GroupBox && IsCard(widget)) {
+      painter->fillRect(option->rect, QColor(kCream));
+      painter->setPen(QColor(kGreen));
+      painter->drawRect(option->rect.adjusted(0, 0, -1, -1));
+    }
+    QProxyStyle::drawComplexControl(control, option, painter, widget);
+  }
+
+  QRect subControlRect(ComplexControl control, const QStyleOptionComplex* option, SubControl part,
+                       const QWidget* widget) const override {
+    const QRect place = QProxyStyle::subControlRect(control, option, part, widget);
+    const bool title = control == CC_GroupBox && part == SC_GroupBoxLabel;
+    return title && IsCard(widget) ? place.translated(kCardTitleIndent, 0) : place;
   }
 
   int styleHint(StyleHint hint, const QStyleOption* option, const QWidget* widget,

@@ -24,8 +24,6 @@ class View : public QObject {
   [[nodiscard]] Control& GetControl() const { return control_; }
   /// Null for a menu entry, which is no widget.
   [[nodiscard]] QWidget* Widget() const { return widget_; }
-  /// Where the keyboard's focus goes.
-  [[nodiscard]] virtual QWidget* FocusWidget() const { return widget_; }
 
   /// Shows the model's state if it has changed since it was last shown, or is stale.
   void BringUpToDate();

@@ -229,9 +229,11 @@ Outcome WindowHand::Type(Control& control, const std::string& text) {
   if (outcome.lost) return outcome;
   PressKey(*entry, Qt::Key_A, Qt::ControlModifier);
   if (text.empty()) PressKey(*entry, Qt::Key_Delete);
+  // The line of a combo has its focus through the combo.
+  const QWidget* const holder = entry->focusProxy() != nullptr ? entry->focusProxy() : entry;
   for (const QChar letter : ToQt(text)) {
     // What is typed on after the focus has left does not come here.
-    if (!window.isVisible() || window.focusWidget() != entry) break;
+    if (!window.isVisible() || window.focusWidget() != holder) break;
     PressKey(*entry, 0, Qt::NoModifier, letter);
     Taken();
   }

@@ -33,7 +33,7 @@ class Desktop : private Observer {
   RealFileSystem files_;
   HelpWindow help_;
   MessageBoxes boxes_;
-  PagePrinter printer_;
+  PagePrinter printer_{OpenInViewer};
   DesktopDialogs dialogs_;
   DesktopClipboard clipboard_;
   DesktopSound sound_;

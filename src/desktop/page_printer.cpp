@@ -45,6 +45,8 @@ QFont Drawn(const PrinterFont& font) {
 
 }  // namespace
 
+void OpenInViewer(const QString& path) { QDesktopServices::openUrl(QUrl::fromLocalFile(path)); }
+
 std::string PagePrinter::DeviceName() {
   switch (Target().kind) {
     case PrintTarget::Kind::Printer:
@@ -159,7 +161,7 @@ void PagePrinter::SendToPrinter(const Pages& pages) {
   Paint(printer, pages);
 }
 
-void PagePrinter::SendToPdf(const Pages& pages) {
+void PagePrinter::SendToPdf(const Pages& pages) const {
   const QDir folder(QStandardPaths::writableLocation(QStandardPaths::DocumentsLocation));
   folder.mkpath(".");
   const QString stamp = QDateTime::currentDateTime().toString("yyyy-MM-dd HH.mm.ss.zzz");
@@ -169,7 +171,7 @@ void PagePrinter::SendToPdf(const Pages& pages) {
   writer.setTitle("Marlowbeck");
   SetLayout(writer);
   Paint(writer, pages);
-  QDesktopServices::openUrl(QUrl::fromLocalFile(path));
+  view_(path);
 }
 
 void PagePrinter::SendToPreview(const Pages& pages) {

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <functional>
 #include <string>
 #include <variant>
 #include <vector>
@@ -23,6 +24,8 @@ struct PrintTarget {
 /// printer, into a PDF file that opens in the viewer, or into a preview. The paper is A4.
 class PagePrinter : public Printer {
  public:
+  /// `view` is called with the path of each PDF file once it is whole.
+  explicit PagePrinter(std::function<void(const QString& path)> view) : view_(std::move(view)) {}
   std::string DeviceName() override;
   Orientation GetOrientation() override { return orientation_; }
   void SetOrientation(Orientation orientation) override { orientation_ = orientation; }
@@ -58,14 +61,18 @@ class PagePrinter : public Printer {
   void SetLayout(QPagedPaintDevice& device) const;
   void Send(const Pages& pages);
   void SendToPrinter(const Pages& pages);
-  void SendToPdf(const Pages& pages);
+  void SendToPdf(const Pages& pages) const;
   void SendToPreview(const Pages& pages);
 
+  std::function<void(const QString&)> view_;
   PrinterFont font_;
   Orientation orientation_ = Orientation::Portrait;
   Pages pages_ = Pages(1);
   PrintTarget target_;
   bool target_known_ = false;
 };
+
+/// Opens a file in the program that the desktop has for it.
+void OpenInViewer(const QString& path);
 
 }  // namespace marlowbeck

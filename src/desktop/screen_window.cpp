@@ -40,6 +40,17 @@ void ScreenWindow::MakeViews(Windows& windows) {
     views_.push_back(MakeView(*control, *window_, windows));
     if (QWidget* const widget = views_.back()->Widget()) by_widget_[widget] = views_.back().get();
   }
+  SetTabOrder();
+}
+
+/// The order of declaration, for whoever reads the window by other means than its keys.
+void ScreenWindow::SetTabOrder() {
+  QWidget* before = nullptr;
+  for (const auto& view : views_) {
+    if (!view->GetControl().TakesFocus() || view->Widget() == nullptr) continue;
+    if (before != nullptr) QWidget::setTabOrder(before, view->Widget());
+    before = view->Widget();
+  }
 }
 
 View* ScreenWindow::ViewAt(const QObject* widget) const {
@@ -100,7 +111,8 @@ void ScreenWindow::PlaceFocus(bool anew) {
   }
   QWidget* const target = view->Widget();
   const bool had_it = window_->focusWidget() == target;
-  if (!had_it) target->setFocus(Qt::OtherFocusReason);
+  // As by the keyboard, so that its mark is seen.
+  if (!had_it) target->setFocus(Qt::TabFocusReason);
   if (!had_it || anew) view->FocusCame();
 }
 

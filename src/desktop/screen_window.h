@@ -38,6 +38,7 @@ class ScreenWindow : public QObject {
 
  private:
   void MakeViews(Windows& windows);
+  void SetTabOrder();
   void Centre();
   void MarkDefault();
 

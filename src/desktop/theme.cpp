@@ -30,6 +30,8 @@ constexpr int kBigPoints = 20;
 
 constexpr int kButtonHeight = 32;
 constexpr int kButtonWidth = 96;
+constexpr int kButtonMargin = 16;
+constexpr int kMenuMargin = 8;
 constexpr int kEntryHeight = 30;
 constexpr int kLineHeight = 24;
 constexpr int kCardTitleIndent = 24;
@@ -48,7 +50,9 @@ class Style : public QProxyStyle {
     const QSize size = QProxyStyle::sizeFromContents(type, option, contents, widget);
     switch (type) {
       case CT_PushButton:
-        return size.expandedTo({kButtonWidth, kButtonHeight});
+        return (size + QSize(kButtonMargin, 0)).expandedTo({kButtonWidth, kButtonHeight});
+      case CT_MenuBarItem:
+        return size + QSize(0, kMenuMargin);
       case CT_LineEdit:
       case CT_ComboBox:
       case CT_SpinBox:

@@ -12,6 +12,17 @@ void Screens::Register(std::string_view name, Factory factory) {
 
 bool Screens::Knows(std::string_view name) const { return factories_.contains(UpperCase(name)); }
 
+std::vector<std::string> Screens::Names() const {
+  std::vector<std::string> names;
+  for (const auto& [name, factory] : factories_) names.push_back(name);
+  return names;
+}
+
+std::unique_ptr<Screen> Screens::Make(std::string_view name) {
+  const auto factory = factories_.find(UpperCase(name));
+  return factory == factories_.end() ? nullptr : factory->second(*this);
+}
+
 Screen* Screens::Find(std::string_view name) const {
   for (const auto& screen : loaded_) {
     if (EqualsIgnoringCase(screen->Name(), name)) return screen.get();
@@ -27,10 +38,10 @@ std::shared_ptr<Screen> Screens::Hold(const Screen& screen) const {
 
 Screen* Screens::Load(std::string_view name) {
   if (Screen* const screen = Find(name)) return screen;
-  const auto factory = factories_.find(UpperCase(name));
-  if (factory == factories_.end()) return nullptr;
+  std::unique_ptr<Screen> made = Make(name);
+  if (made == nullptr) return nullptr;
   // Lowest of all until it is shown.
-  Screen* const screen = loaded_.insert(loaded_.begin(), factory->second(*this))->get();
+  Screen* const screen = loaded_.insert(loaded_.begin(), std::move(made))->get();
   dispatcher_.Run([screen] { screen->Load(); });
   return Find(name) == screen ? screen : nullptr;
 }

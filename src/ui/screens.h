@@ -22,6 +22,10 @@ class Screens {
 
   void Register(std::string_view name, Factory factory);
   [[nodiscard]] bool Knows(std::string_view name) const;
+  /// Every name that there is a screen for, upper-cased.
+  [[nodiscard]] std::vector<std::string> Names() const;
+  /// A screen as it is before it is loaded, and apart from those that are; null for an unknown one.
+  [[nodiscard]] std::unique_ptr<Screen> Make(std::string_view name);
 
   [[nodiscard]] Dispatcher& GetDispatcher() { return dispatcher_; }
 

@@ -1,0 +1,14 @@
+# Lays the sample season beside the program, open and with its night picked, unless something has been
+# opened there before.
+get_filename_component(prefix "${CMAKE_INSTALL_PREFIX}" ABSOLUTE)
+set(place "$ENV{DESTDIR}${prefix}")
+if(NOT EXISTS "${place}/FileName.qz3" AND EXISTS "${samples}/Winter.qza")
+  file(GLOB season "${samples}/Winter*" "${samples}/*.qz3")
+  file(COPY ${season} DESTINATION "${place}")
+  # Side files are not written in UTF-8: a path beyond ASCII is left to the working folder.
+  set(path "${prefix}/Winter.qza")
+  if(NOT path MATCHES "^[ -~]*$")
+    set(path "Winter.qza")
+  endif()
+  file(WRITE "${place}/FileName.qz3" "\"${path}\"\r\n")
+endif()

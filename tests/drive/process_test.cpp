@@ -119,6 +119,30 @@ TEST_F(DriveProcess, RunsNoClosingStepsAtTheEndOfTheScript) {
   EXPECT_EQ(run.status, 0);
 }
 
+#ifdef MARLOWBECK_WINDOWS
+
+TEST_F(DriveProcess, WorksRealWindowsWithoutADisplay) {
+  unsetenv("QT_QPA_PLATFORM");
+  const DriveRun run =
+      Drive("--window " + Folder(), "screens\nshot the menu.png 900 700\nclick imgExit\nscreens\n");
+  EXPECT_EQ(run.status, 0) << run.errors;
+  ASSERT_EQ(run.answers.size(), 4U);
+  EXPECT_EQ(run.answers[0]["front"], "frmDB");
+  EXPECT_EQ(run.answers[1]["size"], Json::parse("[900, 700]"));
+  EXPECT_TRUE(fs::exists(scratch.Path() / "the menu.png"));
+  EXPECT_EQ(run.answers[3]["front"], "frmBuend");
+}
+
+#else
+
+TEST_F(DriveProcess, SaysSoWhereItWasBuiltWithoutWindows) {
+  const DriveRun run = Drive("--window " + Folder(), "screens\n");
+  EXPECT_EQ(run.status, 2);
+  EXPECT_NE(run.errors.find("without windows"), std::string::npos);
+}
+
+#endif
+
 /// A driver that runs while the test talks to it.
 class TalkingDriver {
  public:

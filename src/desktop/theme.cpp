@@ -64,8 +64,14 @@ class Style : public QProxyStyle {
     }
   }
 
+  /// A card is a panel that stands over others: filled, and framed all round with its title.
   void drawComplexControl(ComplexControl control, const QStyleOptionComplex* option,
                           QPainter* painter, const QWidget* widget) const override {
+    if (control == CC_GroupBox && IsCard(widget)) {
+      painter->fillRect(option->rect, QColor(kCream));
+      painter->setPen(QColor(kGreen));
+      painter->drawRect(option->rect.adjusted(0, 0, -1, -1));
+    }
     const auto* const group = qstyleoption_cast<const QStyleOptionGroupBox*>(option);
     if (group == nullptr || widget == nullptr || !widget->isEnabled()) {
       return QProxyStyle::drawComplexControl(control, option, painter, widget);
@@ -90,17 +96,6 @@ class Style : public QProxyStyle {
       default:
         return QProxyStyle::standardIcon(icon, option, widget);
     }
-  }
-
-  /// A card is a panel that stands over others: filled, and framed all round with its title.
-  void drawComplexControl(ComplexControl control, const QStyleOptionComplex* option,
-                          QPainter* painter, const QWidget* widget) const override {
-    if (control == CC_GroupBox && IsCard(widget)) {
-      painter->fillRect(option->rect, QColor(kCream));
-      painter->setPen(QColor(kGreen));
-      painter->drawRect(option->rect.adjusted(0, 0, -1, -1));
-    }
-    QProxyStyle::drawComplexControl(control, option, painter, widget);
   }
 
   QRect subControlRect(ComplexControl control, const QStyleOptionComplex* option, SubControl part,

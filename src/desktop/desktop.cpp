@@ -13,7 +13,7 @@ Desktop::Desktop(const std::string& working_folder, const QString& manual)
       platform_{boxes_, dialogs_, printer_, clipboard_, sound_,
                 help_,  clock_,   timer_,   display_,   *this},
       program_(platform_, files_, working_folder),
-      windows_(program_.GetScreens(), program_.GetHand(), [] { QApplication::quit(); }),
+      windows_(program_.GetScreens(), program_.GetHand(), [] { QApplication::exit(); }),
       filter_(windows_) {
   qApp->installEventFilter(&filter_);
 }

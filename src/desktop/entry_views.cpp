@@ -14,7 +14,8 @@ CaptionedView::CaptionedView(Control& control, QWidget* widget, Windows& windows
 
 void CaptionedView::ShowCommon() {
   View::ShowCommon();
-  Widget()->setAccessibleName(Spoken(GetControl().Caption()));
+  const std::string& caption = GetControl().Caption();
+  if (!caption.empty()) Widget()->setAccessibleName(Spoken(caption));
   if (buddy_ == nullptr) return;
   buddy_->setText(ToMnemonicText(GetControl().Caption()));
   buddy_->setEnabled(GetControl().Enabled());

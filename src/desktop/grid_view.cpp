@@ -71,9 +71,18 @@ void GridView::ShowKind() {
     shown_figures_from_ = model_.FiguresFrom();
     ShowHeading();
     ShowCells();
-    table_.resizeColumnsToContents();
+    FitColumns();
   }
   ShowCurrent();
+}
+
+/// As wide as the widest cell, and some air.
+void GridView::FitColumns() {
+  constexpr int kAir = 14;  // pixels
+  table_.resizeColumnsToContents();
+  for (int col = 0; col < table_.columnCount(); ++col) {
+    table_.setColumnWidth(col, table_.columnWidth(col) + kAir);
+  }
 }
 
 void GridView::ShowHeading() {

@@ -22,6 +22,7 @@ class GridView : public CaptionedView {
  private:
   void ShowCells();
   void ShowHeading();
+  void FitColumns();
   void ShowCurrent();
   void PressCell(int row, int col);
   [[nodiscard]] Qt::Alignment AlignmentOf(int col) const;

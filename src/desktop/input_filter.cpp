@@ -125,11 +125,17 @@ bool InputFilter::Key(const QObject& watched, ScreenWindow& window, QKeyEvent& e
 bool InputFilter::CommonKey(const QKeyEvent& event, const View* view) {
   const auto key = HandKeyOf(event);
   // A key that is held down is not pressed again.
-  const bool repeats = key != Key::Up && key != Key::Down && key != Key::Tab && key != Key::BackTab;
-  if (event.isAutoRepeat() && repeats) return true;
+  const bool is_tab = key == Key::Tab || key == Key::BackTab;
+  const bool is_arrow = key == Key::Up || key == Key::Down;
+  if (event.isAutoRepeat() && !is_tab && !is_arrow) return true;
   if (view != nullptr) FinishTyping();
   if (key) {
-    windows_.DoByKey([&](Hand& hand) { return hand.Press(*key); });
+    const auto press = [&](Hand& hand) { return hand.Press(*key); };
+    if (is_tab || key == Key::Enter) {
+      windows_.DoByKey(press);
+    } else {
+      windows_.Do(nullptr, press);
+    }
     return true;
   }
   const char letter = AltLetter(event);

@@ -6,7 +6,9 @@
 #include <vector>
 
 #include <QFont>
+#include <QLineF>
 #include <QPagedPaintDevice>
+#include <QRectF>
 #include <QString>
 
 #include "platform/printer.h"

@@ -44,7 +44,7 @@ void DesktopSound::Prepare(const std::string& wave_file) { wave_file_ = wave_fil
 /// Waits for the end, but never for long: a machine without a voice must not hold up a save.
 void DesktopSound::Play() {
   const QString path = QDir(QString::fromStdString(folder_)).filePath(ToQt(wave_file_));
-  if (!QFileInfo::exists(path)) return;
+  if (mute_ || !QFileInfo::exists(path)) return;
   if (player_ == nullptr) {
     auto effect = std::make_unique<QSoundEffect>();
     effect->setSource(QUrl::fromLocalFile(path));
@@ -52,7 +52,9 @@ void DesktopSound::Play() {
   }
   auto& effect = static_cast<QSoundEffect&>(*player_);
   QEventLoop loop;
+  bool heard = false;
   QObject::connect(&effect, &QSoundEffect::playingChanged, &loop, [&] {
+    heard = heard || effect.isPlaying();
     if (!effect.isPlaying()) loop.quit();
   });
   QObject::connect(&effect, &QSoundEffect::statusChanged, &loop, [&] {
@@ -61,6 +63,7 @@ void DesktopSound::Play() {
   QTimer::singleShot(kLongestSound, &loop, &QEventLoop::quit);
   effect.play();
   if (effect.status() != QSoundEffect::Error) loop.exec(QEventLoop::ExcludeUserInputEvents);
+  mute_ = !heard;
 }
 #else
 void DesktopSound::Play() {}

@@ -32,6 +32,7 @@ class DesktopSound : public Sound {
   std::string folder_;
   std::string wave_file_;
   std::unique_ptr<QObject> player_;
+  bool mute_ = false;  ///< found out at the first sound: no other is waited for
 };
 
 class DesktopClock : public Clock {

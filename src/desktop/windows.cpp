@@ -24,7 +24,8 @@ Outcome Windows::Do(View* acted, const Act& act) {
   // A click that was lost stays lost, whatever the person does on.
   if (!outcome_ || !outcome_->lost) outcome_ = outcome;
   Refresh();
-  if (ScreenWindow* const front = Front()) front->PlaceFocus(false);
+  // A box that would not be left is entered anew.
+  if (ScreenWindow* const front = Front()) front->PlaceFocus(outcome.lost);
   if (screens_.Ended() && ended_) std::exchange(ended_, nullptr)();
   return outcome;
 }
@@ -46,6 +47,7 @@ Outcome Windows::Guarded(const Act& act) {
   try {
     return act(hand_);
   } catch (...) {
+    if (!keeps_failures_) throw;
     failure_ = std::current_exception();
     return {"the event was broken off", true};
   }

@@ -39,6 +39,9 @@ class Windows {
   [[nodiscard]] ScreenWindow* Front() const;
   [[nodiscard]] Screens& GetScreens() { return screens_; }
 
+  /// What breaks an act off is kept for TakeOutcome. Without this it ends the program, since it can
+  /// only be a fault in it.
+  void KeepFailures() { keeps_failures_ = true; }
   /// How the acts since the last asking went; nothing when there was none. Rethrows what broke one
   /// off.
   std::optional<Outcome> TakeOutcome();
@@ -58,6 +61,7 @@ class Windows {
   bool acting_ = false;
   bool busy_ = false;
   std::optional<Outcome> outcome_;
+  bool keeps_failures_ = false;
   std::exception_ptr failure_;
 };
 

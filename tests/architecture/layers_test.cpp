@@ -1,7 +1,5 @@
 // The arrows between the layers, read from the includes.
 
-#include <gtest/gtest.h>
-
 #include <filesystem>
 #include <fstream>
 #include <map>
@@ -9,6 +7,8 @@
 #include <set>
 #include <string>
 #include <vector>
+
+#include <gtest/gtest.h>
 
 namespace marlowbeck {
 namespace {
@@ -51,8 +51,8 @@ const std::set<std::string> kFaces = {"desktop", "drive"};
 
 /// How high a folder stands; subsystems, which are all others, stand on one level.
 int LevelOf(const std::string& folder) {
-  static const std::map<std::string, int> kLevels = {{"data", 0},    {"platform", 1}, {"ui", 1},
-                                                     {"print", 2},   {"program", 4},  {"drive", 5},
+  static const std::map<std::string, int> kLevels = {{"data", 0},   {"platform", 1}, {"ui", 1},
+                                                     {"print", 2},  {"program", 4},  {"drive", 5},
                                                      {"desktop", 6}};
   const auto place = kLevels.find(folder);
   return place == kLevels.end() ? 3 : place->second;

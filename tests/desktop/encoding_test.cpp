@@ -45,7 +45,7 @@ TEST(Captions, AreSpokenWithoutMarksAndColon) {
 }
 
 TEST(Dates, TheFirstAndTheLastAreShown) {
-  EXPECT_EQ(ToQt(Date{0}), QDate(100, 1, 1));
+  EXPECT_EQ(ToQt(Date{-1e9}), QDate(100, 1, 1));
   EXPECT_EQ(ToQt(Date{1e9}), QDate(9999, 12, 31));
   EXPECT_EQ(ToQt(Date{38077}), QDate(2004, 3, 31));
   EXPECT_EQ(FromQt(QDate(2004, 3, 31)), Date{38077});

@@ -2,17 +2,17 @@
 
 #include "desktop/message_boxes.h"
 
-#include <gtest/gtest.h>
-
 #include <QApplication>
+#include <QKeyEvent>
 #include <QTimer>
+#include <gtest/gtest.h>
 
 namespace marlowbeck {
 namespace {
 
 constexpr std::array<BoxStyle, 7> kStyles = {
-    BoxStyle::StopOk,        BoxStyle::StopOkCancel,           BoxStyle::StopYesNo,
-    BoxStyle::WarningOk,     BoxStyle::InformationOk,          BoxStyle::InformationYesNoCancel,
+    BoxStyle::StopOk,          BoxStyle::StopOkCancel,  BoxStyle::StopYesNo,
+    BoxStyle::WarningOk,       BoxStyle::InformationOk, BoxStyle::InformationYesNoCancel,
     BoxStyle::InformationYesNo};
 
 class RealBoxes : public testing::Test {

@@ -2,10 +2,9 @@
 
 #include "desktop/page_printer.h"
 
-#include <gtest/gtest.h>
-
 #include <QDir>
 #include <QStandardPaths>
+#include <gtest/gtest.h>
 
 namespace marlowbeck {
 namespace {

@@ -127,6 +127,7 @@ struct frmNames : Screen {
   void OpenPlayers();
   void AskForNewName(const std::string& prompt, const std::string& title, InUse in_use,
                      ComboBox& combo);
+  void AddNewName(const std::string& name, InUse in_use, ComboBox& combo);
   [[nodiscard]] bool AnyBoxTicked() const;
   void PutFirstPlayer();
   void PutPlayer();

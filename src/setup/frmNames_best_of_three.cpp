@@ -19,7 +19,6 @@ constexpr int kChanging = 1;
 /// Takes the code of the grade in the combo; 0, and false, while it has no player.
 bool frmNames::FindBestOfThree() {
   OpenPlayers();
-  session_.BestOfThree = 0;
   const std::optional<Integer> code = BestOfThreeOf(context_.channels, cboAddGrd.Text());
   context_.channels.CloseAll();
   session_.BestOfThree = code.value_or(0);
@@ -63,7 +62,15 @@ void frmNames::cmdEdBOT_Click() {
   fraGT3.Hide();
   fraPList.Hide();
   session_.Flag = kChanging;
-  CheckNoP();
+  try {
+    CheckNoP();
+  } catch (const RunTimeError&) {
+    // With all of its panels away the screen could not be left.
+    context_.channels.AbandonAll();
+    session_.Flag = 0;
+    CloseBestOfThree();
+    throw;
+  }
   NewGradePegs();
 }
 

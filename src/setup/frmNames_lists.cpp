@@ -112,18 +112,26 @@ void frmNames::AskForNewName(const std::string& prompt, const std::string& title
                              ComboBox& combo) {
   ButtonsOFF();
   const std::string reply = context_.platform.boxes.Input({prompt, title, {}, {}});
-  if (!Trimmed(reply).empty()) {
-    OpenPlayers();
-    const bool taken = in_use(context_.channels, reply);
-    context_.channels.CloseAll();
-    if (taken) {
-      Warning(context_, reply + " is already in use.    ");
-    } else {
-      AddAndSelect(combo, reply);
-    }
+  try {
+    if (!Trimmed(reply).empty()) AddNewName(reply, in_use, combo);
+  } catch (const RunTimeError&) {
+    context_.channels.AbandonAll();
+    ButtonsON();
+    throw;
   }
   ButtonsON();
   txtAddSn.SetFocus();
+}
+
+void frmNames::AddNewName(const std::string& name, InUse in_use, ComboBox& combo) {
+  OpenPlayers();
+  const bool taken = in_use(context_.channels, name);
+  context_.channels.CloseAll();
+  if (taken) {
+    Warning(context_, name + " is already in use.    ");
+  } else {
+    AddAndSelect(combo, name);
+  }
 }
 
 }  // namespace marlowbeck

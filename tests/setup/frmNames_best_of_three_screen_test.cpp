@@ -50,6 +50,24 @@ TEST_F(BestOfThreeTest, LeavingANewGradeAsksForItsGames) {
   EXPECT_EQ(Focus(), "frmNames.cmdNoPOK");
 }
 
+TEST_F(BestOfThreeTest, AFailedLookAtTheSettingLeavesItAndTheScreenAsTheyWere) {
+  OpenSetup(TwoGrades());
+  const auto code = InSession("BestOfThree");
+  DoAll({"fault any 2 57", "click cmdEdBOT"});
+  EXPECT_EQ(Count("error"), 1);
+  EXPECT_EQ(InSession("BestOfThree"), code);
+  ExpectListsBack();
+}
+
+TEST_F(BestOfThreeTest, AFailedLookAtTheNamesInUseGivesTheCommandsBack) {
+  OpenSetup(TwoGrades());
+  DoAll({"input Kings", "fault open 1 57", "click cmdNewTm"});
+  EXPECT_EQ(Count("error"), 1);
+  EXPECT_TRUE(Enabled("cmdAddCancel"));
+  DoAll({"input Kings", "click cmdNewTm"});
+  EXPECT_EQ(Text("cboAddTm"), "Kings");
+}
+
 TEST_F(BestOfThreeTest, AClickAwayFromANewGradeIsLostToThePanel) {
   OpenSetup(TwoGrades());
   TypeNames("Evans", "Flo");

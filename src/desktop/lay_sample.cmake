@@ -2,7 +2,8 @@
 # opened there before.
 get_filename_component(prefix "${CMAKE_INSTALL_PREFIX}" ABSOLUTE)
 set(place "$ENV{DESTDIR}${prefix}")
-if(NOT EXISTS "${place}/FileName.qz3" AND EXISTS "${samples}/Winter.qza")
+if(NOT EXISTS "${place}/FileName.qz3" AND NOT EXISTS "${place}/Winter.qza"
+   AND EXISTS "${samples}/Winter.qza")
   file(GLOB season "${samples}/Winter*" "${samples}/*.qz3")
   file(COPY ${season} DESTINATION "${place}")
   # Side files are not written in UTF-8: a path beyond ASCII is left to the working folder.

@@ -16,11 +16,14 @@ Screen& ScreenInFront(const Screens& screens) {
 
 Control& ControlNamed(const std::string& name, const Screens& screens) {
   const auto dot = name.find('.');
-  const Screen& screen =
-      dot == std::string::npos ? ScreenInFront(screens) : ScreenNamed(name.substr(0, dot), screens);
-  const std::string own = dot == std::string::npos ? name : name.substr(dot + 1);
-  if (Control* const control = screen.Find(own)) return *control;
-  throw Refusal(screen.Name() + " has no control " + own);
+  const bool bare = dot == std::string::npos;
+  const Screen* const screen = bare ? screens.Front() : screens.Find(name.substr(0, dot));
+  if (screen == nullptr) {
+    throw Refusal(name + ": " + (bare ? "no screen is in front" : "its screen is not loaded"));
+  }
+  const std::string own = bare ? name : name.substr(dot + 1);
+  if (Control* const control = screen->Find(own)) return *control;
+  throw Refusal(screen->Name() + " has no control " + own);
 }
 
 Screen& TakeScreen(Arguments& arguments, const Screens& screens) {

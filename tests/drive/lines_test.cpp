@@ -71,14 +71,14 @@ TEST_F(ScriptLine, ReachesAnotherScreenOnlyByItsName) {
   bench->InScreens().Load("frmShelf");
   EXPECT_EQ(Refused("get cmdTake"), "frmDB has no control cmdTake");
   EXPECT_EQ(Get("frmShelf.cmdTake")["caption"], "Take");
-  EXPECT_EQ(Refused("get frmAttic.cmdTake"), "there is no screen frmAttic now");
+  EXPECT_EQ(Refused("get frmAttic.cmdTake"), "frmAttic.cmdTake: its screen is not loaded");
   EXPECT_EQ(Refused("get frmDB.cmdTake"), "frmDB has no control cmdTake");
 }
 
 TEST_F(ScriptLine, WithABareNameIsRefusedWhenNoScreenIsInFront) {
   Start();
   bench->InScreens().HideQuietly(*bench);
-  EXPECT_EQ(Refused("get txtName"), "no screen is in front");
+  EXPECT_EQ(Refused("get txtName"), "txtName: no screen is in front");
   EXPECT_EQ(Refused("state"), "no screen is in front");
   EXPECT_EQ(Refused("key Enter"), "no screen is in front");
   EXPECT_EQ(Front(), "");

@@ -141,6 +141,7 @@ class Club {
 
   std::vector<std::unique_ptr<House>> houses_;
   Json events_ = Json::array();
+  bool parted_ = false;  ///< the faces have been seen to differ: what follows from it is not told
 };
 
 /// A test of screens, run in every face of the executable.

@@ -57,7 +57,8 @@ std::uint64_t Channels::Position(const Open& open, int number) {
 
 Integer Channels::RecordCount(Channel channel) {
   Open& open = Random(channel);
-  return Integer::Narrow(static_cast<double>(open.file->Length() / open.record_length));
+  const std::uint64_t whole_records = open.file->Length() / open.record_length;
+  return Integer::Narrow(static_cast<double>(whole_records));
 }
 
 void Channels::ReadRun(Open& open, int first, std::span<std::byte> into) {

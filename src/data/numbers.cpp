@@ -20,8 +20,9 @@ struct NumericPrefix {
 
 /// Of a number that no double can hold: it is too close to 0, not too large.
 bool IsTiny(std::string_view number) {
-  return number.find("e-") != number.npos || number.find("E-") != number.npos ||
-         number.front() == '.' || number.front() == '0';
+  return number.find("e-") != std::string_view::npos ||
+         number.find("E-") != std::string_view::npos || number.front() == '.' ||
+         number.front() == '0';
 }
 
 /// The longest numeric prefix of a text without leading blanks; length 0 when there is none.

@@ -277,7 +277,7 @@ std::filesystem::path RealFileSystem::Located(const std::string& path) const {
   if (path.empty() || path.find('\0') != std::string::npos) {
     throw RunTimeError(ErrorNumber::BadFileName);
   }
-  const fs::path full = (current_ / PathOfText(path)).lexically_normal();
+  fs::path full = (current_ / PathOfText(path)).lexically_normal();
   std::error_code error;
   if (fs::exists(full, error)) return full;
   fs::path located = full.root_path();

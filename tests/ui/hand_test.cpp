@@ -395,8 +395,11 @@ TEST_F(HandTest, SettingTheFocusWhereItCannotGoDoesNothing) {
   EXPECT_EQ(Focus(), "none");
 }
 
-TEST_F(HandTest, HoveringNeedsNothingButTheSight) {
+TEST_F(HandTest, HoveringNeedsALiveControl) {
   a.cmdA.Disable();
+  EXPECT_FALSE(hand.Hover(a.cmdA).Done());
+  EXPECT_EQ(Happened(), Log{});
+  a.cmdA.Enable();
   EXPECT_TRUE(hand.Hover(a.cmdA).Done());
   EXPECT_EQ(Happened(), Log{"hover cmdA"});
   EXPECT_TRUE(hand.HoverScreen(a).Done());

@@ -16,9 +16,9 @@ bool CanBeWritten(const QString& folder) {
 
 /// The program's own folder, or, where that is read only, one for the user's data.
 QString WorkingFolder() {
-  const QString own = QApplication::applicationDirPath();
+  QString own = QApplication::applicationDirPath();
   if (CanBeWritten(own)) return own;
-  const QString data = QStandardPaths::writableLocation(QStandardPaths::AppDataLocation);
+  QString data = QStandardPaths::writableLocation(QStandardPaths::AppDataLocation);
   QDir().mkpath(data);
   return data;
 }

@@ -111,8 +111,9 @@ void ScreenWindow::PlaceFocus(bool anew) {
   }
   QWidget* const target = view->Widget();
   const bool had_it = window_->focusWidget() == target;
-  // As by the keyboard, so that its mark is seen.
+  // As by the keyboard, so that its mark is seen, also in a window that is not active yet.
   if (!had_it) target->setFocus(Qt::TabFocusReason);
+  window_->setAttribute(Qt::WA_KeyboardFocusChange);
   if (!had_it || anew) view->FocusCame();
 }
 

@@ -47,7 +47,7 @@ int ShowEmptyWindow() {
 }
 
 int StartProgram(const std::string& folder) {
-  ApplyTheme(*qApp);
+  ApplyTheme();
   Desktop desktop(folder, QString::fromStdString(folder));
   return desktop.Start() ? QApplication::exec() : 1;
 }

@@ -29,7 +29,7 @@ int main(int argc, char** argv) {
   QApplication application(argc, argv);
   QApplication::setApplicationName("Marlowbeck");
   QApplication::setApplicationVersion("4.2");
-  marlowbeck::ApplyTheme(application);
+  marlowbeck::ApplyTheme();
   const QString folder = QDir::toNativeSeparators(WorkingFolder());
   marlowbeck::Desktop desktop(marlowbeck::FromQt(folder), QApplication::applicationDirPath());
   return desktop.Start() ? QApplication::exec() : 0;

@@ -110,7 +110,6 @@ class Style : public QProxyStyle {
     switch (hint) {
       case SH_DialogButtonBox_ButtonsHaveIcons:
       case SH_EtchDisabledText:
-        return 0;
       case SH_MessageBox_CenterButtons:
         return 0;
       default:
@@ -187,13 +186,13 @@ void KeepRoom(QWidget& widget) {
 
 }  // namespace
 
-void ApplyTheme(QApplication& application) {
+void ApplyTheme() {
   QApplication::setStyle(new Style);  // taken over by the application
   QApplication::setPalette(OurPalette());
   QApplication::setFont(WorkFont());
   QApplication::setWindowIcon(IconNamed("app"));
   QApplication::setEffectEnabled(Qt::UI_AnimateCombo, false);
-  application.setQuitOnLastWindowClosed(false);
+  QApplication::setQuitOnLastWindowClosed(false);
 }
 
 void ApplyRoles(QWidget& window) {

@@ -14,7 +14,7 @@ namespace marlowbeck {
 inline constexpr const char* kMeaning = "meaning";
 
 /// Style, palette and type of the whole application.
-void ApplyTheme(QApplication& application);
+void ApplyTheme();
 
 /// Dresses the widgets of a form by their `role`: "heading", "hint", "figure", "big", "fixed". One
 /// that `keepsRoom` leaves its place empty while it is hidden.

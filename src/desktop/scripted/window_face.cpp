@@ -18,8 +18,8 @@ namespace {
 void NeedApplication(int& argc, char** argv) {
   if (QApplication::instance() != nullptr) return;
   if (qEnvironmentVariableIsEmpty("QT_QPA_PLATFORM")) qputenv("QT_QPA_PLATFORM", "offscreen");
-  auto* const application = new QApplication(argc, argv);  // lives to the end
-  ApplyTheme(*application);
+  new QApplication(argc, argv);  // lives to the end
+  ApplyTheme();
 }
 
 /// Works the real windows, and sees what they show.

@@ -17,7 +17,7 @@ Windows::~Windows() {
 Outcome Windows::Do(View* acted, const Act& act) {
   if (acting_) return {};
   acting_ = true;
-  const Outcome outcome = Guarded(act);
+  Outcome outcome = Guarded(act);
   acting_ = false;
   if (std::exchange(busy_, false)) QApplication::restoreOverrideCursor();
   if (acted != nullptr) acted->MakeStale();
@@ -32,7 +32,7 @@ Outcome Windows::Do(View* acted, const Act& act) {
 
 Outcome Windows::DoByKey(const Act& act) {
   const Control* const before = screens_.Focus();
-  const Outcome outcome = Do(nullptr, act);
+  Outcome outcome = Do(nullptr, act);
   ScreenWindow* const front = Front();
   if (front != nullptr && screens_.Focus() == before) front->PlaceFocus(true);
   return outcome;

@@ -75,7 +75,7 @@ void ScrollIntoView(QWidget& widget) {
 Outcome WindowHand::Perform(const Action& action) {
   if (action.verb != Action::Verb::Mnemonic) CloseDropped();
   windows_.TakeOutcome();
-  const Outcome outcome = Dispatch(action);
+  Outcome outcome = Dispatch(action);
   SettleEvents();
   return outcome;
 }
@@ -83,7 +83,7 @@ Outcome WindowHand::Perform(const Action& action) {
 Outcome WindowHand::Dispatch(const Action& action) {
   using Verb = Action::Verb;
   if (action.control != nullptr && action.verb != Verb::Hover) {
-    if (const Outcome check = CheckLive(*action.control); !check.Done()) return check;
+    if (Outcome check = CheckLive(*action.control); !check.Done()) return check;
   }
   switch (action.verb) {
     case Verb::Click:
@@ -206,7 +206,7 @@ Outcome WindowHand::ClickMenu(const Control& control) {
 Outcome WindowHand::DoubleClick(const Action& action) {
   Control& control = *action.control;
   const auto held = windows_.GetScreens().Hold(control.InScreen());
-  const Outcome outcome = Click(control);
+  Outcome outcome = Click(control);
   if (!outcome.Done() || outcome.lost || !control.DoubleClick) return outcome;
   if (windows_.WindowOf(control.InScreen()) == nullptr || !CheckLive(control).Done()) {
     return outcome;
@@ -225,7 +225,7 @@ Outcome WindowHand::Type(Control& control, const std::string& text) {
   const auto place = FreePlace(view);
   if (!place) return Refused(control, "is out of reach behind something else");
   ClickMouse(*entry, entry->rect().center());
-  const Outcome outcome = Taken();
+  Outcome outcome = Taken();
   if (outcome.lost) return outcome;
   PressKey(*entry, Qt::Key_A, Qt::ControlModifier);
   if (text.empty()) PressKey(*entry, Qt::Key_Delete);
@@ -259,7 +259,7 @@ Outcome WindowHand::PickInCombo(View& view, int line) {
     return Refused(view.GetControl(), "is out of reach behind something else");
   }
   ClickMouse(combo, ArrowOf(combo));
-  const Outcome outcome = Taken();
+  Outcome outcome = Taken();
   if (outcome.lost) return outcome;
   QAbstractItemView& list = *combo.view();
   if (!list.isVisible()) return Refused(view.GetControl(), "does not drop down");
@@ -281,7 +281,7 @@ Outcome WindowHand::PickInList(View& view, int line, Qt::KeyboardModifiers modif
 
 Outcome WindowHand::PickTwice(Control& control, int line) {
   const auto held = windows_.GetScreens().Hold(control.InScreen());
-  const Outcome outcome = Pick(control, line);
+  Outcome outcome = Pick(control, line);
   if (!outcome.Done() || outcome.lost || !control.DoubleClick) return outcome;
   if (windows_.WindowOf(control.InScreen()) == nullptr || !CheckLive(control).Done()) {
     return outcome;
@@ -338,7 +338,7 @@ Outcome WindowHand::Cell(Control& control, int row, int col) {
 
 Outcome WindowHand::CellTwice(Control& control, int row, int col) {
   const auto held = windows_.GetScreens().Hold(control.InScreen());
-  const Outcome outcome = Cell(control, row, col);
+  Outcome outcome = Cell(control, row, col);
   if (!outcome.Done() || outcome.lost || !control.DoubleClick) return outcome;
   if (windows_.WindowOf(control.InScreen()) == nullptr || !CheckLive(control).Done()) {
     return outcome;
@@ -357,7 +357,7 @@ Outcome WindowHand::PickDate(Control& control, Date date) {
   if (!FreePlace(view)) return Refused(control, "is out of reach behind something else");
   constexpr int kArrow = 8;
   ClickMouse(*box, {box->width() - kArrow, box->height() / 2});
-  const Outcome outcome = Taken();
+  Outcome outcome = Taken();
   if (outcome.lost) return outcome;
   QCalendarWidget& calendar = *box->calendarWidget();
   if (!calendar.isVisible()) return Refused(control, "does not drop down");

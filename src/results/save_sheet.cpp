@@ -93,9 +93,12 @@ void frmResults::FillRecord() {
 
 void frmResults::WriteRecord() {
   Session& session = context_.session;
-  if (session.EditRecord == 0) ++session.ResultCount;
-  const int number = session.EditRecord > 0 ? session.EditRecord : session.ResultCount;
+  const bool is_new = session.EditRecord == 0;
+  const int number = is_new ? ++session.ResultCount : session.EditRecord;
   context_.channels.Put(Channel::Results, number, Encode(record_));
+  // Should it fail to reach the disk, the sheet stays open: saving it again is to write this record
+  // again, and not a second one.
+  session.EditRecord = number;
 }
 
 }  // namespace marlowbeck

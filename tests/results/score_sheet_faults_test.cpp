@@ -83,6 +83,19 @@ TEST(ScoreSheetFaults, ANewSheetIsWholeOrNotThereAfterAPowerCut) {
   EXPECT_GT(SweepPowerCuts(NewSheet()), 5);
 }
 
+TEST(ScoreSheetFaults, ASheetSavedAgainAfterItDidNotReachTheDiskStandsOnce) {
+  Club club(ModelFaceAlone());
+  LeadToNewSheet(club);
+  club.DoAll({"fault sync 1 57", "click cmdSave"});
+  EXPECT_EQ(club.Count("sound"), 0);
+  EXPECT_EQ(club.Count("error"), 1);
+  club.Do("click cmdSave");
+  EXPECT_EQ(club.Count("sound"), 1);
+  std::vector<ResultRecord> after = Before();
+  after.push_back(NewOne());
+  EXPECT_TRUE(SameResults(club.File(kAResults), FileOf(after)));
+}
+
 TEST(ScoreSheetFaults, ACorrectionIsOldOrNewWhateverFails) {
   EXPECT_GT(SweepFailures(Correction()), 5);
 }

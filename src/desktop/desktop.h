@@ -18,8 +18,8 @@ namespace marlowbeck {
 /// The program on a desktop: its platform, its windows, and the way in for mouse and keyboard.
 class Desktop : private Observer {
  public:
-  /// `working_folder` is a path in code page 1252; the manual lies in `manual`.
-  Desktop(const std::string& working_folder, const QString& manual);
+  /// The sound and the manual lie in the working folder or, where it has none, in the program's.
+  Desktop(const QString& working_folder, const QString& program_folder);
   ~Desktop() override;
 
   /// Shows the main menu. Answers false when the program has ended itself on the way.

@@ -16,6 +16,7 @@
 
 #include "data/text.h"
 #include "desktop/encoding.h"
+#include "desktop/working_folder.h"
 
 namespace marlowbeck {
 namespace {
@@ -40,11 +41,18 @@ void DesktopSound::Beep() { QApplication::beep(); }
 
 void DesktopSound::Prepare(const std::string& wave_file) { wave_file_ = wave_file; }
 
+QString DesktopSound::WavePath() const {
+  if (wave_file_.empty()) return {};
+  const QString name = ToQt(wave_file_);
+  const QString path = QDir(FolderWith(name, folders_)).filePath(name);
+  return QFileInfo::exists(path) ? path : QString();
+}
+
 #ifdef MARLOWBECK_MULTIMEDIA
 /// Waits for the end, but never for long: a machine without a voice must not hold up a save.
 void DesktopSound::Play() {
-  const QString path = QDir(QString::fromStdString(folder_)).filePath(ToQt(wave_file_));
-  if (mute_ || !QFileInfo::exists(path)) return;
+  const QString path = WavePath();
+  if (mute_ || path.isEmpty()) return;
   if (player_ == nullptr) {
     auto effect = std::make_unique<QSoundEffect>();
     effect->setSource(QUrl::fromLocalFile(path));

@@ -4,6 +4,8 @@
 #include <memory>
 #include <string>
 
+#include <QStringList>
+
 #include "platform/platform.h"
 
 class QObject;
@@ -22,14 +24,18 @@ class DesktopClipboard : public Clipboard {
 /// the first is wanted, which keeps the start short.
 class DesktopSound : public Sound {
  public:
-  explicit DesktopSound(std::string folder) : folder_(std::move(folder)) {}
+  /// The wave file lies in one of these folders; the first that has it counts.
+  explicit DesktopSound(QStringList folders) : folders_(std::move(folders)) {}
   ~DesktopSound() override;
   void Beep() override;
   void Prepare(const std::string& wave_file) override;
   void Play() override;
 
+  /// Where the prepared file lies; empty when it lies nowhere.
+  [[nodiscard]] QString WavePath() const;
+
  private:
-  std::string folder_;
+  QStringList folders_;
   std::string wave_file_;
   std::unique_ptr<QObject> player_;
   bool mute_ = false;  ///< found out at the first sound: no other is waited for

@@ -115,6 +115,7 @@ Action ReadHover(World& world, Arguments& arguments) {
   action.screen = world.GetScreens().Find(name);
   action.verb = action.screen != nullptr ? Verb::HoverScreen : Verb::Hover;
   if (action.screen == nullptr) action.control = &ControlNamed(name, world.GetScreens());
+  arguments.About(action.screen != nullptr ? action.screen->Name() : action.control->Name());
   return action;
 }
 

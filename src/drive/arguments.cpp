@@ -75,7 +75,7 @@ void Arguments::Finish() const {
 }
 
 void Arguments::Refuse(std::string_view why) const {
-  throw Refusal(command_ + ": " + std::string(why));
+  throw Refusal(command_ + (about_.empty() ? "" : " " + about_) + ": " + std::string(why));
 }
 
 }  // namespace marlowbeck

@@ -14,12 +14,14 @@ namespace marlowbeck {
 [[nodiscard]] std::optional<std::string> ReadScriptLine(std::string_view line);
 
 /// What stands in a script line, taken off from the front. All that cannot be read is a Refusal
-/// that names the command and what it lacks.
+/// that names the command, the control that it is about, and what is wrong.
 class Arguments {
  public:
   explicit Arguments(std::string_view line);
 
   [[nodiscard]] const std::string& Command() const { return command_; }
+  /// What the command turns out to be about: refusals name it from here on.
+  void About(std::string_view name) { about_ = name; }
   [[nodiscard]] bool AtEnd() const;
 
   /// The next word, which `what` names to the reader of a refusal.
@@ -36,6 +38,7 @@ class Arguments {
 
  private:
   std::string command_;
+  std::string about_;
   std::string_view rest_;
 };
 

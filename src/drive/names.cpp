@@ -27,11 +27,15 @@ Control& ControlNamed(const std::string& name, const Screens& screens) {
 }
 
 Screen& TakeScreen(Arguments& arguments, const Screens& screens) {
-  return ScreenNamed(arguments.Word("a screen"), screens);
+  Screen& screen = ScreenNamed(arguments.Word("a screen"), screens);
+  arguments.About(screen.Name());
+  return screen;
 }
 
 Control& TakeControl(Arguments& arguments, const Screens& screens) {
-  return ControlNamed(arguments.Word("a control"), screens);
+  Control& control = ControlNamed(arguments.Word("a control"), screens);
+  arguments.About(control.Name());
+  return control;
 }
 
 }  // namespace marlowbeck

@@ -29,21 +29,31 @@ TEST_F(ScriptLine, OfAnUnknownCommandIsRefusedByName) {
 
 TEST_F(ScriptLine, WithoutWhatItNeedsIsRefusedByName) {
   EXPECT_EQ(Refused("click"), "click: needs a control");
-  EXPECT_EQ(Refused("pick lstOne"), "pick: needs a line");
-  EXPECT_EQ(Refused("pick lstOne two"), "pick: needs a number for the line, not \"two\"");
-  EXPECT_EQ(Refused("pick lstOne 1x"), "pick: needs a number for the line, not \"1x\"");
-  EXPECT_EQ(Refused("cell grdTable 1"), "cell: needs the column");
+  EXPECT_EQ(Refused("pick lstOne"), "pick lstOne: needs a line");
+  EXPECT_EQ(Refused("pick lstOne two"), "pick lstOne: needs a number for the line, not \"two\"");
+  EXPECT_EQ(Refused("pick lstOne 1x"), "pick lstOne: needs a number for the line, not \"1x\"");
+  EXPECT_EQ(Refused("cell grdTable 1"), "cell grdTable: needs the column");
   EXPECT_EQ(Refused("date dtpDay 31/03/2004"),
-            "date: needs a date as YYYY-MM-DD, not \"31/03/2004\"");
+            "date dtpDay: needs a date as YYYY-MM-DD, not \"31/03/2004\"");
   EXPECT_EQ(Refused("date dtpDay 2004-02-30"),
-            "date: needs a date as YYYY-MM-DD, not \"2004-02-30\"");
+            "date dtpDay: needs a date as YYYY-MM-DD, not \"2004-02-30\"");
   EXPECT_EQ(Refused("key Escape"), "key: there is no key Escape");
   EXPECT_EQ(Refused("file"), "file: needs a path");
   EXPECT_EQ(Refused("close"), "close: needs a screen");
 }
 
+TEST_F(ScriptLine, WithNumbersBelowThoseThatAreThereIsRefusedByTheControlsName) {
+  EXPECT_EQ(Refused("pick LSTONE -1"), "pick lstOne: the line must be at least 0");
+  EXPECT_EQ(Refused("select lstMany 0 -1"), "select lstMany: a line must be at least 0");
+  EXPECT_EQ(Refused("select lstMany x"), "select lstMany: needs a number for a line, not \"x\"");
+  EXPECT_EQ(Refused("cell grdTable -1 0"), "cell grdTable: the row must be at least 0");
+  EXPECT_EQ(Refused("cell grdTable 0 -1"), "cell grdTable: the column must be at least 0");
+  EXPECT_EQ(Refused("close frmDB now"), "close frmDB: has \"now\" more than it takes");
+  EXPECT_EQ(Refused("hover txtName now"), "hover txtName: has \"now\" more than it takes");
+}
+
 TEST_F(ScriptLine, WithMoreThanItTakesIsRefused) {
-  EXPECT_EQ(Refused("click cmdDo now"), "click: has \"now\" more than it takes");
+  EXPECT_EQ(Refused("click cmdDo now"), "click cmdDo: has \"now\" more than it takes");
   EXPECT_EQ(Refused("screens all"), "screens: has \"all\" more than it takes");
   EXPECT_EQ(Refused("waiting 1"), "waiting: has \"1\" more than it takes");
   EXPECT_EQ(Refused("answer yes no"), "answer: has \"no\" more than it takes");

@@ -2,9 +2,24 @@
 
 #include <QAbstractItemView>
 
+#include "data/runtime_error.h"
 #include "desktop/encoding.h"
 
 namespace marlowbeck {
+namespace {
+
+/// A record may hold a day that no calendar has. The box stands on its first day then, which it
+/// shows as no date.
+bool CanBeShown(Date date) {
+  try {
+    static_cast<void>(CivilFromDate(date));
+    return true;
+  } catch (const RunTimeError&) {
+    return false;
+  }
+}
+
+}  // namespace
 
 CaptionedView::CaptionedView(Control& control, QWidget* widget, Windows& windows)
     : View(control, widget, windows),
@@ -104,6 +119,7 @@ DateView::DateView(DatePicker& control, QDateEdit* box, Windows& windows)
   box_.setDisplayFormat("dd/MM/yyyy");
   box_.setCalendarPopup(true);
   box_.setDateRange(QDate(100, 1, 1), QDate(9999, 12, 31));
+  box_.setSpecialValueText("no date");
   box_.setKeyboardTracking(false);
   box_.setAcceptDrops(false);
   connect(box, &QDateEdit::userDateChanged, this, [this](QDate date) {
@@ -112,10 +128,14 @@ DateView::DateView(DatePicker& control, QDateEdit* box, Windows& windows)
 }
 
 void DateView::ShowKind() {
-  const QDate date = ToQt(model_.Value());
+  const QDate date = CanBeShown(model_.Value()) ? ToQt(model_.Value()) : box_.minimumDate();
   if (box_.date() != date) box_.setDate(date);
 }
 
-void DateView::ReadKind(ControlState& state) const { state.date = FromQt(box_.date()); }
+void DateView::ReadKind(ControlState& state) const {
+  constexpr double kDayOfNoCalendar = 1e300;
+  const bool shows_none = box_.text() == box_.specialValueText();
+  state.date = shows_none ? Date{kDayOfNoCalendar} : FromQt(box_.date());
+}
 
 }  // namespace marlowbeck

@@ -45,18 +45,14 @@ class Sweeping : public ::testing::Test {
     SweptWork work;
     work.prepare = [keeping](Club& club) {
       club.WriteFile("note.qz3", "\"old\"\r\n");
-      club.registration = [keeping](Screens& screens, const Context& context) {
-        screens.Register("frmDB", [keeping, &context](Screens& in) {
-          auto made = std::make_unique<Workbench>(in, context);
-          made->cmdDo.Click = [keeping, &context] {
-            context.GoToWorkingFolder();
-            context.channels.OpenOutput(Channel::Side, "note.qz3", keeping);
-            context.channels.Writer(Channel::Side).Text(std::string(200, 'n')).EndLine();
-            context.channels.CloseAll();
-          };
-          return made;
-        });
-      };
+      club.registration = WithWorkbench([keeping](Workbench& bench) {
+        bench.cmdDo.Click = [keeping, &context = bench.context] {
+          context.GoToWorkingFolder();
+          context.channels.OpenOutput(Channel::Side, "note.qz3", keeping);
+          context.channels.Writer(Channel::Side).Text(std::string(200, 'n')).EndLine();
+          context.channels.CloseAll();
+        };
+      });
     };
     work.lines = {"click cmdDo"};
     work.check = [this](Club& club) { left.insert(club.File("note.qz3").substr(0, 5)); };
@@ -96,7 +92,7 @@ class ClubItself : public WorkbenchTest {};
 
 TEST_F(ClubItself, FailsATestOnALineThatWasNotDone) {
   Start();
-  EXPECT_NONFATAL_FAILURE(Do("click cmdGone"), "frmDB has no control cmdGone");
+  EXPECT_NONFATAL_FAILURE(Do("click cmdGone"), "frmBench has no control cmdGone");
   EXPECT_NONFATAL_FAILURE(Refused("click cmdDo"), "was not refused");
   EXPECT_NONFATAL_FAILURE(Try("# nothing"), "has no answer");
 }
@@ -111,13 +107,8 @@ TEST_F(ClubItself, KeepsItsFolderOverARestart) {
 class TwoFaces : public ::testing::Test {
  protected:
   TwoFaces() {
-    club.registration = [this](Screens& screens, const Context& context) {
-      screens.Register("frmDB", [this, &context](Screens& in) {
-        auto bench = std::make_unique<Workbench>(in, context);
-        bench->lblPlain.SetCaption("bench " + std::to_string(++made));
-        return bench;
-      });
-    };
+    club.registration = WithWorkbench(
+        [this](Workbench& bench) { bench.lblPlain.SetCaption("bench " + std::to_string(++made)); });
   }
   static std::vector<TestFace> Both() {
     std::vector<TestFace> faces = ModelFaceAlone();
@@ -134,7 +125,7 @@ TEST_F(TwoFaces, MustAnswerTheSame) {
 }
 
 TEST_F(TwoFaces, MustSeeTheSame) {
-  EXPECT_NONFATAL_FAILURE(club.Do("click cmdDo"), "frmDB.lblPlain differs");
+  EXPECT_NONFATAL_FAILURE(club.Do("click cmdDo"), "frmBench.lblPlain differs");
   club.Do("get lblPlain");  // told once
   std::ofstream(club.FilePath("only.txt")) << "x";
   EXPECT_NONFATAL_FAILURE(club.ExpectEqualFolders(), "hold different files");

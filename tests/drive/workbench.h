@@ -1,39 +1,16 @@
 #pragma once
 
 #include <functional>
-#include <memory>
+#include <string>
 
 #include "support/club.h"
 #include "ui/controls.h"
 
 namespace marlowbeck {
 
-/// A screen with every kind of control, to try the script's words on. It stands in the place of the
-/// main menu.
+/// A screen with every kind of control, to try the script's words on.
 struct Workbench : Screen {
-  Workbench(Screens& screens, const Context& in)
-      : Screen(screens, "frmDB", "Workbench"), context(in) {
-    for (const char* line : {"first", "second", "third"}) {
-      for (LineHolder* list : std::initializer_list<LineHolder*>{
-               &lstOne, &lstMany, &cboLocked, &cboFree, &drvDrives, &dirFolders, &filFiles}) {
-        list->AddLine(line);
-      }
-    }
-    lstMany.SetMulti(true);
-    filFiles.SetMulti(true);
-    dirFolders.SetPath("/club/data");
-    filFiles.SetPath("/club/data");
-    grdTable.SetSize(2, 3);
-    grdTable.SetCell(0, 0, "Name");
-    grdTable.SetCell(1, 2, "17.89");
-    txtLocked.SetText("as it is");
-    txtLocked.SetLocked(true);
-    dtpDay.SetValue(*DateFromCivil({2004, 3, 31}));
-    prgBar.SetRange(0, 40);
-    prgBar.SetValue(10);
-    Helps = {&cmdHelp};
-    Cancels = {&cmdEnd};
-  }
+  Workbench(Screens& screens, const Context& in);
 
   const Context& context;
 
@@ -50,6 +27,8 @@ struct Workbench : Screen {
   CheckBox chkTick{*this, "chkTick", "Tick"};
   Label lblPlain{*this, "lblPlain", "plain"};
   Label lblClick{*this, "lblClick", "click me"};
+  Label lblChange{*this, "lblChange", "change"};  ///< a click on it does what a test wants changed
+  Label lblTold{*this, "lblTold"};                ///< what the handlers were told
   Picture imgShape{*this, "imgShape", "Shape"};
   MenuEntry mnuFile{*this, "mnuFile", "&File"};
   MenuEntry mnuOpen{mnuFile, "mnuOpen", "&Open"};
@@ -63,6 +42,11 @@ struct Workbench : Screen {
   DiskList drvDrives{*this, Kind::Drives, "drvDrives"};
   DiskList dirFolders{*this, Kind::Folders, "dirFolders"};
   DiskList filFiles{*this, Kind::Files, "filFiles"};
+
+  void Tell(const std::string& what) { lblTold.SetCaption(lblTold.Caption() + what + ";"); }
+  void Box(const std::string& text) {
+    context.platform.boxes.Message({text, "Title", BoxStyle::WarningOk});
+  }
 };
 
 /// A second screen behind the workbench.
@@ -71,33 +55,31 @@ struct Shelf : Screen {
   Command cmdTake{*this, "cmdTake", "Take"};
 };
 
-/// The workbench worked by lines of a script. Works models.
-class WorkbenchTest : public ::testing::Test, protected Club {
+using BenchWork = std::function<void(Workbench&)>;
+
+/// A program that opens on the workbench and has a shelf behind it. `prepare` is called at the
+/// making of each workbench.
+Program::Registration WithWorkbench(BenchWork prepare);
+
+/// The workbench worked by lines of a script, in every face of the executable.
+class WorkbenchTest : public ClubTest {
  protected:
-  WorkbenchTest() : Club(ModelFaceAlone()) {
-    registration = [this](Screens& screens, const Context& context) {
-      screens.Register("frmDB", [&](Screens& in) {
-        auto made = std::make_unique<Workbench>(in, context);
-        bench = made.get();
-        if (prepare) prepare(*made);
-        return made;
-      });
-      screens.Register("frmShelf", [](Screens& in) { return std::make_unique<Shelf>(in); });
-      screens.Register("frmErrors", MakeErrors(context));
-    };
-  }
+  WorkbenchTest();
 
-  /// Lets a click on cmdDo do something with what the program works with.
-  void OnDo(std::function<void(const Context&)> work) {
-    Start();
-    bench->cmdDo.Click = [this, work] { work(bench->context); };
-  }
+  /// What a click on cmdDo does from now on.
+  void OnDo(BenchWork work);
+  /// Changes something on the workbench, as an event of its own that moves no focus.
+  void Change(const BenchWork& change, Here here = Here::current());
+  /// Carries out a line and answers what the handlers were told by it.
+  std::string ToldBy(std::string_view line, Here here = Here::current());
 
-  Workbench* bench = nullptr;               ///< once the program runs
-  std::function<void(Workbench&)> prepare;  ///< run at the making of the workbench
+  BenchWork prepare;  ///< run at the making of the workbench
 
  private:
-  static Screens::Factory MakeErrors(const Context& context);
+  void SetUpBench(Workbench& bench);
+
+  BenchWork do_;
+  BenchWork change_;
 };
 
 }  // namespace marlowbeck

@@ -8,7 +8,9 @@
 
 namespace marlowbeck {
 
-/// A piece of work to be broken at every file operation. Sweeps work the models.
+/// A piece of work to be broken at every file operation. Sweeps work the models alone: what is
+/// broken lies below the screens, where both faces are one, and a sweep starts the program hundreds
+/// of times.
 struct SweptWork {
   /// Lays the files and leads up to the work.
   std::function<void(Club&)> prepare;

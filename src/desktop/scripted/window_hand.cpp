@@ -4,9 +4,11 @@
 #include <array>
 #include <stdexcept>
 
+#include <QAbstractButton>
 #include <QAbstractItemView>
 #include <QApplication>
 #include <QCalendarWidget>
+#include <QCheckBox>
 #include <QComboBox>
 #include <QDateEdit>
 #include <QHeaderView>
@@ -15,7 +17,7 @@
 #include <QMenu>
 #include <QMenuBar>
 #include <QScrollArea>
-#include <QStyleOptionComboBox>
+#include <QStyleOption>
 #include <QTableView>
 #include <QTableWidget>
 
@@ -61,6 +63,19 @@ QPoint ArrowOf(const QComboBox& combo) {
   return combo.style()
       ->subControlRect(QStyle::CC_ComboBox, &option, QStyle::SC_ComboBoxArrow, &combo)
       .center();
+}
+
+/// Where a widget answers to a click: a box with a caption only on those two.
+QRect AnsweringArea(const QWidget& widget) {
+  const auto* const button = qobject_cast<const QAbstractButton*>(&widget);
+  if (button == nullptr || !button->isCheckable()) return widget.rect();
+  QStyleOptionButton option;
+  option.initFrom(button);
+  option.text = button->text();
+  const auto area = qobject_cast<const QCheckBox*>(button) != nullptr
+                        ? QStyle::SE_CheckBoxClickRect
+                        : QStyle::SE_RadioButtonClickRect;
+  return widget.style()->subElementRect(area, &option, &widget);
 }
 
 void ScrollIntoView(QWidget& widget) {
@@ -150,9 +165,10 @@ std::optional<WindowHand::Place> WindowHand::FreePlace(View& view) const {
     if (hit == nullptr || window.ViewAt(hit) != &view) return std::nullopt;
     return Place{hit, hit->mapFrom(&outer, widget.mapTo(&outer, at))};
   };
-  if (const auto centre = place_at(widget.rect().center())) return centre;
-  for (int y = kStep / 2; y < widget.height(); y += kStep) {
-    for (int x = kStep / 2; x < widget.width(); x += kStep) {
+  const QRect area = AnsweringArea(widget);
+  if (const auto centre = place_at(area.center())) return centre;
+  for (int y = area.top() + kStep / 2; y <= area.bottom(); y += kStep) {
+    for (int x = area.left() + kStep / 2; x <= area.right(); x += kStep) {
       if (const auto place = place_at({x, y})) return place;
     }
   }

@@ -9,7 +9,7 @@ namespace {
 class Printing : public WorkbenchTest {
  protected:
   void Print(const std::function<void(Printer&)>& work) {
-    OnDo([work](const Context& context) { work(context.platform.printer); });
+    OnDo([work](Workbench& bench) { work(bench.context.platform.printer); });
   }
 };
 
@@ -91,7 +91,9 @@ TEST_F(Printing, TakesSizesForThePresentOrientationAlone) {
 }
 
 TEST_F(Printing, HasADeviceName) {
-  Print([this](Printer& printer) { bench->lblPlain.SetCaption(printer.DeviceName()); });
+  OnDo([](Workbench& bench) {
+    bench.lblPlain.SetCaption(bench.context.platform.printer.DeviceName());
+  });
   Do("click cmdDo");
   EXPECT_EQ(Caption("lblPlain"), "Test printer");
   DoAll({"printer name Old Laser 5", "click cmdDo"});

@@ -48,7 +48,7 @@ TEST_F(ScriptLine, WithNumbersBelowThoseThatAreThereIsRefusedByTheControlsName) 
   EXPECT_EQ(Refused("select lstMany x"), "select lstMany: needs a number for a line, not \"x\"");
   EXPECT_EQ(Refused("cell grdTable -1 0"), "cell grdTable: the row must be at least 0");
   EXPECT_EQ(Refused("cell grdTable 0 -1"), "cell grdTable: the column must be at least 0");
-  EXPECT_EQ(Refused("close frmDB now"), "close frmDB: has \"now\" more than it takes");
+  EXPECT_EQ(Refused("close frmBench now"), "close frmBench: has \"now\" more than it takes");
   EXPECT_EQ(Refused("hover txtName now"), "hover txtName: has \"now\" more than it takes");
 }
 
@@ -73,21 +73,19 @@ TEST_F(ScriptLine, ThatIsRefusedChangesNothingAndHasNoEvents) {
 
 TEST_F(ScriptLine, NamesControlsWithoutRegardToCase) {
   EXPECT_EQ(Get("TXTNAME")["name"], "txtName");
-  EXPECT_EQ(Get("FRMdb.OptBoth(1)")["name"], "optBoth(1)");
+  EXPECT_EQ(Get("FRMbench.OptBoth(1)")["name"], "optBoth(1)");
 }
 
 TEST_F(ScriptLine, ReachesAnotherScreenOnlyByItsName) {
-  Start();
-  bench->InScreens().Load("frmShelf");
-  EXPECT_EQ(Refused("get cmdTake"), "frmDB has no control cmdTake");
+  Change([](Workbench& bench) { bench.InScreens().Load("frmShelf"); });
+  EXPECT_EQ(Refused("get cmdTake"), "frmBench has no control cmdTake");
   EXPECT_EQ(Get("frmShelf.cmdTake")["caption"], "Take");
   EXPECT_EQ(Refused("get frmAttic.cmdTake"), "frmAttic.cmdTake: its screen is not loaded");
-  EXPECT_EQ(Refused("get frmDB.cmdTake"), "frmDB has no control cmdTake");
+  EXPECT_EQ(Refused("get frmBench.cmdTake"), "frmBench has no control cmdTake");
 }
 
 TEST_F(ScriptLine, WithABareNameIsRefusedWhenNoScreenIsInFront) {
-  Start();
-  bench->InScreens().HideQuietly(*bench);
+  Change([](Workbench& bench) { bench.InScreens().HideQuietly(bench); });
   EXPECT_EQ(Refused("get txtName"), "txtName: no screen is in front");
   EXPECT_EQ(Refused("state"), "no screen is in front");
   EXPECT_EQ(Refused("key Enter"), "no screen is in front");

@@ -3,29 +3,24 @@
 namespace marlowbeck {
 namespace {
 
-/// Counts what reaches the handlers of the workbench.
+/// Every handler of the workbench tells that it was called.
 class Acting : public WorkbenchTest {
  protected:
   Acting() {
-    prepare = [this](Workbench& made) {
-      for (Control* control : made.Controls()) {
-        if (control == &made.lblPlain || control == &made.fraPlain) continue;
-        control->Click = [this, control] { told += control->Name() + " clicked;"; };
-        control->DoubleClick = [this, control] { told += control->Name() + " doubly;"; };
-        control->Change = [this, control] { told += control->Name() + " changed;"; };
-        control->MouseMove = [this, control] { told += control->Name() + " hovered;"; };
+    prepare = [](Workbench& bench) {
+      for (Control* control : bench.Controls()) {
+        if (control == &bench.lblPlain || control == &bench.fraPlain) continue;
+        if (control == &bench.lblTold || control == &bench.prgBar) continue;
+        const auto telling = [&bench, name = control->Name()](const char* what) {
+          return [&bench, told = name + what] { bench.Tell(told); };
+        };
+        control->Click = telling(" clicked");
+        control->DoubleClick = telling(" doubly");
+        control->Change = telling(" changed");
+        control->MouseMove = telling(" hovered");
       }
     };
   }
-
-  /// Carries out a line and answers what the handlers were told by it.
-  std::string ToldBy(std::string_view line, Here here = Here::current()) {
-    told.clear();
-    Do(line, here);
-    return told;
-  }
-
-  std::string told;
 };
 
 TEST_F(Acting, ClickReachesEveryKindThatHasOne) {
@@ -48,15 +43,15 @@ TEST_F(Acting, ClickTicksABoxAndChoosesAnOption) {
 TEST_F(Acting, ClickIsRefusedWhereNobodyCouldClick) {
   EXPECT_EQ(Refused("click lblPlain"), "lblPlain has no click");
   EXPECT_EQ(Refused("click fraPlain"), "fraPlain has no click");
-  bench->cmdDo.Hide();
+  Change([](Workbench& bench) { bench.cmdDo.Hide(); });
   EXPECT_EQ(Refused("click cmdDo"), "cmdDo is hidden");
-  bench->cmdOff.Disable();
+  Change([](Workbench& bench) { bench.cmdOff.Disable(); });
   EXPECT_EQ(Refused("click cmdOff"), "cmdOff is disabled");
-  bench->fraPlain.Disable();
+  Change([](Workbench& bench) { bench.fraPlain.Disable(); });
   EXPECT_EQ(Refused("click optBoth(1)"), "optBoth(1) is disabled");
-  bench->fraPlain.Hide();
+  Change([](Workbench& bench) { bench.fraPlain.Hide(); });
   EXPECT_EQ(Refused("click optBoth(1)"), "optBoth(1) is hidden");
-  bench->SetEnabled(false);
+  Change([](Workbench& bench) { bench.SetEnabled(false); });
   EXPECT_EQ(Refused("click cmdHelp"), "cmdHelp is disabled");
 }
 
@@ -72,7 +67,7 @@ TEST_F(Acting, TypeReplacesTheTextBlanksIncluded) {
   EXPECT_EQ(Text("txtName"), " Jo  Archer ");
   Do("type txtName Jo");
   EXPECT_EQ(Text("txtName"), "Jo");
-  EXPECT_EQ(Focus(), "frmDB.txtName");
+  EXPECT_EQ(Focus(), "frmBench.txtName");
 }
 
 TEST_F(Acting, TypeAloneEmptiesTheBox) {
@@ -85,8 +80,12 @@ TEST_F(Acting, TypeAloneEmptiesTheBox) {
 
 TEST_F(Acting, TypeTakesLettersOfTheProgramsPage) {
   Do("type txtName M\xC3\xBCller");
-  EXPECT_EQ(bench->txtName.Text(), "M\xFCller");
   EXPECT_EQ(Text("txtName"), "M\xC3\xBCller");
+  OnDo([](Workbench& bench) {
+    EXPECT_EQ(bench.txtName.Text(), "M\xFCller");
+    bench.Tell("seen");
+  });
+  EXPECT_EQ(ToldBy("click cmdDo"), "seen;");
 }
 
 TEST_F(Acting, TypeIsRefusedOnWhatIsLocked) {
@@ -113,8 +112,9 @@ TEST_F(Acting, PickOfTheCurrentLineIsAClickLikeAnyOther) {
 }
 
 TEST_F(Acting, PickByTextTakesTheFirstEqualLineBlanksIncluded) {
-  Start();
-  for (const char* line : {"a  b ", " =c", "a  b "}) bench->lstOne.AddLine(line);
+  Change([](Workbench& bench) {
+    for (const char* line : {"a  b ", " =c", "a  b "}) bench.lstOne.AddLine(line);
+  });
   Do("pick lstOne =a  b ");
   EXPECT_EQ(Index("lstOne"), 3);
   Do("pick lstOne = =c");
@@ -168,11 +168,11 @@ TEST_F(Acting, AnotherDateFiresChangeAndTheSameOneNothing) {
 TEST_F(Acting, KeysGoToTheControlWithTheFocus) {
   Do("focus txtName");
   Do("key Tab");
-  EXPECT_EQ(Focus(), "frmDB.txtLocked");
+  EXPECT_EQ(Focus(), "frmBench.txtLocked");
   Do("key Shift+Tab");
-  EXPECT_EQ(Focus(), "frmDB.txtName");
+  EXPECT_EQ(Focus(), "frmBench.txtName");
   Do("key Enter");  // in an entry box a Tab
-  EXPECT_EQ(Focus(), "frmDB.txtLocked");
+  EXPECT_EQ(Focus(), "frmBench.txtLocked");
   Do("focus cmdDo");
   EXPECT_EQ(ToldBy("key Enter"), "cmdDo clicked;");
   EXPECT_EQ(ToldBy("key F1"), "cmdHelp clicked;");
@@ -189,63 +189,60 @@ TEST_F(Acting, MnemonicsGoByTheirLetter) {
   EXPECT_EQ(ToldBy("key Alt+d"), "cmdDo clicked;");
   Do("key Alt+F");
   EXPECT_EQ(ToldBy("key Alt+O"), "mnuOpen clicked;");
-  EXPECT_EQ(Refused("key Alt+Q"), "frmDB has no live mnemonic Q");
+  EXPECT_EQ(Refused("key Alt+Q"), "frmBench has no live mnemonic Q");
 }
 
 TEST_F(Acting, FocusGoesWhereItIsTaken) {
   Do("focus cboFree");
-  EXPECT_EQ(Focus(), "frmDB.cboFree");
+  EXPECT_EQ(Focus(), "frmBench.cboFree");
   EXPECT_EQ(Refused("focus lblPlain"), "lblPlain takes no focus");
 }
 
 TEST_F(Acting, HoverReachesControlsAndTheBareScreen) {
   EXPECT_EQ(ToldBy("hover imgShape"), "imgShape hovered;");
-  Do("hover frmDB");
-  EXPECT_EQ(Refused("hover frmShelf"), "frmDB has no control frmShelf");
+  Do("hover frmBench");
+  EXPECT_EQ(Refused("hover frmShelf"), "frmBench has no control frmShelf");
 }
 
 TEST_F(Acting, CloseUsesTheWindowsButton) {
-  Start();
-  bench->InScreens().Show("frmShelf");
+  Change([](Workbench& bench) { bench.InScreens().Show("frmShelf"); });
   Do("close frmShelf");
   EXPECT_FALSE(Loaded("frmShelf"));
   EXPECT_EQ(Refused("close frmShelf"), "there is no screen frmShelf now");
 }
 
 TEST_F(Acting, IsLostWhenTheControlLeftShowsABox) {
-  Start();
-  bench->txtName.LostFocus = [this] {
-    bench->context.platform.boxes.Message({"Not so fast.", "T", BoxStyle::WarningOk});
-  };
+  Change([](Workbench& bench) { bench.txtName.LostFocus = [&bench] { bench.Box("Wait."); }; });
   for (const char* line : {"click cmdDo", "type cboFree x", "pick lstOne 1", "cell grdTable 1 1",
                            "date dtpDay 2004-04-07", "select lstMany 1", "dblclick imgShape"}) {
     Do("focus txtName");
-    told.clear();
+    const std::string before = Caption("lblTold");
     const Json answer = Do(line);
     EXPECT_EQ(answer.value("lost", false), true) << line;
     EXPECT_EQ(Boxes().size(), 1U) << line;
-    EXPECT_EQ(told, "") << line;
+    EXPECT_EQ(Caption("lblTold"), before) << line;
   }
 }
 
 TEST_F(Acting, IsLostWhenTheControlLeftCallsTheFocusBack) {
   Do("focus txtName");
-  bench->txtName.LostFocus = [this] { bench->txtName.SetFocus(); };
+  Change(
+      [](Workbench& bench) { bench.txtName.LostFocus = [&bench] { bench.txtName.SetFocus(); }; });
   EXPECT_EQ(Do("click cmdDo")["lost"], true);
-  EXPECT_EQ(Focus(), "frmDB.txtName");
-  EXPECT_EQ(told, "");
+  EXPECT_EQ(Focus(), "frmBench.txtName");
+  EXPECT_EQ(Caption("lblTold"), "");
 }
 
 TEST_F(Acting, ThatIsNotLostSaysNothingOfIt) { EXPECT_FALSE(Do("click cmdDo").contains("lost")); }
 
 TEST_F(Acting, OnAScreenThatGoesWithTheClickIsSafe) {
-  Start();
-  auto* shelf = static_cast<Shelf*>(bench->InScreens().Show("frmShelf"));
-  shelf->cmdTake.Click = [shelf] { shelf->InScreens().Unload(*shelf); };
-  shelf->cmdTake.DoubleClick = [this] { told += "too late"; };
-  Do("dblclick cmdTake");
-  EXPECT_EQ(told, "");
-  EXPECT_EQ(Front(), "frmDB");
+  Change([](Workbench& bench) {
+    auto* const shelf = static_cast<Shelf*>(bench.InScreens().Show("frmShelf"));
+    shelf->cmdTake.Click = [shelf] { shelf->InScreens().Unload(*shelf); };
+    shelf->cmdTake.DoubleClick = [&bench] { bench.Tell("too late"); };
+  });
+  EXPECT_EQ(ToldBy("dblclick cmdTake"), "");
+  EXPECT_EQ(Front(), "frmBench");
 }
 
 }  // namespace

@@ -10,7 +10,7 @@ namespace {
 class Faults : public WorkbenchTest {
  protected:
   void Work(const std::function<void(FileSystem&)>& work) {
-    OnDo([work](const Context& context) { work(context.channels.Files()); });
+    OnDo([work](Workbench& bench) { work(bench.context.channels.Files()); });
   }
   /// The number of the error that a click on cmdDo ends in; 0 for none.
   int ErrorOfClick() {
@@ -154,7 +154,7 @@ TEST_F(Faults, AreRefusedInWordsThatNameWhatIsWrong) {
 }
 
 TEST_F(Faults, OfTheProgramThatNoRunTimeErrorTellsAreAnswered) {
-  OnDo([](const Context&) { throw std::runtime_error("a slip"); });
+  OnDo([](Workbench&) { throw std::runtime_error("a slip"); });
   const Json answer = Try("click cmdDo");
   EXPECT_EQ(answer["ok"], false);
   EXPECT_EQ(answer["error"], "fault in the program: a slip");

@@ -5,28 +5,30 @@
 namespace marlowbeck {
 namespace {
 
-/// A click on cmdDo asks something; `answered` is what the program was told.
+/// A click on cmdDo asks something; what the program was told then stands in lblPlain.
 class Answers : public WorkbenchTest {
  protected:
   void AskBy(BoxStyle style) {
-    OnDo([=, this](const Context& context) {
-      answered = std::to_string(context.platform.boxes.Message({"Sure ?", "Title", style}));
+    OnDo([=](Workbench& bench) {
+      const int button = bench.context.platform.boxes.Message({"Sure ?", "Title", style});
+      bench.lblPlain.SetCaption(std::to_string(button));
     });
   }
   void AskForText(std::optional<int> topic = std::nullopt) {
-    OnDo([=, this](const Context& context) {
-      answered = context.platform.boxes.Input({"How many ?", "Title", "3", topic});
+    OnDo([=](Workbench& bench) {
+      bench.lblPlain.SetCaption(
+          bench.context.platform.boxes.Input({"How many ?", "Title", "3", topic}));
     });
   }
   void AskForFile(const FileDialogRequest& request) {
-    OnDo([=, this](const Context& context) {
-      answered = context.platform.dialogs.File(request).value_or("(cancelled)");
+    OnDo([=](Workbench& bench) {
+      bench.lblPlain.SetCaption(
+          bench.context.platform.dialogs.File(request).value_or("(cancelled)"));
     });
   }
   Json Event() { return Do("click cmdDo")["events"].at(0); }
   Json Waiting() { return Do("waiting")["waiting"]; }
-
-  std::string answered;
+  std::string Answered() { return Caption("lblPlain"); }
 };
 
 const FileDialogRequest kOpenDialog = {
@@ -37,7 +39,7 @@ TEST_F(Answers, OfABoxWithOkAloneAreTakenFromNobody) {
     AskBy(style);
     Do("answer no");
     EXPECT_EQ(Event()["box"]["answer"], 1);
-    EXPECT_EQ(answered, "1");
+    EXPECT_EQ(Answered(), "1");
     EXPECT_EQ(Waiting()["answer"], 1);
     Do("forget");
   }
@@ -48,7 +50,7 @@ TEST_F(Answers, AreTakenInTheOrderInWhichTheyWait) {
   DoAll({"answer no", "answer cancel", "answer yes"});
   for (const char* expected : {"7", "2", "6"}) {
     Do("click cmdDo");
-    EXPECT_EQ(answered, expected);
+    EXPECT_EQ(Answered(), expected);
     EXPECT_FALSE(Boxes().at(0).unexpected);
   }
   EXPECT_EQ(Waiting()["answer"], 0);
@@ -67,7 +69,7 @@ TEST_F(Answers, MissingForABoxAreCancelWhereItHasItElseNo) {
                            {"answer", answer},
                            {"unexpected", true}};
     EXPECT_EQ(Event()["box"], expected);
-    EXPECT_EQ(answered, std::to_string(answer));
+    EXPECT_EQ(Answered(), std::to_string(answer));
   }
 }
 
@@ -75,7 +77,7 @@ TEST_F(Answers, WithAButtonThatTheBoxLacksAreUsedUpAndToldAsUnexpected) {
   AskBy(BoxStyle::StopOkCancel);
   Do("answer yes");
   EXPECT_EQ(Event()["box"]["unexpected"], true);
-  EXPECT_EQ(answered, "2");
+  EXPECT_EQ(Answered(), "2");
   EXPECT_EQ(Waiting()["answer"], 0);
 }
 
@@ -85,10 +87,10 @@ TEST_F(Answers, OfAnInputBoxAreTextsBlanksIncluded) {
   const Json expected = Json::parse(R"({"input": {"prompt": "How many ?", "title": "Title",
                                         "default": "3", "topic": 46, "answer": " 4 teams "}})");
   EXPECT_EQ(Event(), expected);
-  EXPECT_EQ(answered, " 4 teams ");
+  EXPECT_EQ(Answered(), " 4 teams ");
   for (int i = 0; i < 2; ++i) {
     EXPECT_FALSE(Event()["input"].contains("unexpected"));
-    EXPECT_EQ(answered, "");
+    EXPECT_EQ(Answered(), "");
   }
 }
 
@@ -106,7 +108,7 @@ TEST_F(Answers, OfAFileDialogAreHandedBackAsTheyStand) {
       R"({"file": {"mode": "open", "title": "[Marlowbeck] OPEN file.", "filter": "*.qza",
           "folder": "/club", "name": "*.qza", "ext": "qza", "answer": "/other/My file.txt"}})");
   EXPECT_EQ(Event(), expected);
-  EXPECT_EQ(answered, "/other/My file.txt");
+  EXPECT_EQ(Answered(), "/other/My file.txt");
 }
 
 TEST_F(Answers, OfAFileDialogWithABareNameStandInItsFolder) {
@@ -115,16 +117,16 @@ TEST_F(Answers, OfAFileDialogWithABareNameStandInItsFolder) {
     request.folder = folder;
     AskForFile(request);
     DoAll({"file Winter", "click cmdDo"});
-    EXPECT_EQ(answered, "/club/Winter");
+    EXPECT_EQ(Answered(), "/club/Winter");
   }
   DoAll({"file sub/Winter.qza", "click cmdDo"});
-  EXPECT_EQ(answered, "sub/Winter.qza");
+  EXPECT_EQ(Answered(), "sub/Winter.qza");
 }
 
 TEST_F(Answers, OfAFileDialogThatBeginWithAStarAreThePatternShown) {
   AskForFile(kOpenDialog);
   DoAll({"file *", "click cmdDo"});
-  EXPECT_EQ(answered, "*.qza");
+  EXPECT_EQ(Answered(), "*.qza");
   FileDialogRequest named = kOpenDialog;
   named.mode = FileDialogRequest::Mode::Save;
   named.name = "Winter";
@@ -139,7 +141,7 @@ TEST_F(Answers, OfAFileDialogThatBeginWithAStarAreThePatternShown) {
 TEST_F(Answers, MissingForAFileDialogCancelIt) {
   AskForFile(kOpenDialog);
   EXPECT_EQ(Event()["file"]["unexpected"], true);
-  EXPECT_EQ(answered, "(cancelled)");
+  EXPECT_EQ(Answered(), "(cancelled)");
   Do("file-cancel");
   const Json event = Event()["file"];
   EXPECT_EQ(event["answer"], "");
@@ -147,19 +149,19 @@ TEST_F(Answers, MissingForAFileDialogCancelIt) {
 }
 
 TEST_F(Answers, OfAFontDialogAreWholeFonts) {
-  OnDo([this](const Context& context) {
-    const auto font = context.platform.dialogs.Font({"MS Sans Serif", 10, true, false});
-    answered = font ? font->name + std::to_string(font->size) : "(cancelled)";
+  OnDo([](Workbench& bench) {
+    const auto font = bench.context.platform.dialogs.Font({"MS Sans Serif", 10, true, false});
+    bench.lblPlain.SetCaption(font ? font->name + std::to_string(font->size) : "(cancelled)");
   });
   DoAll({"font 12 0 1 Liberation Sans", "font-cancel"});
   EXPECT_EQ(Event(), Json::parse(R"({"font": {"size": 10, "name": "MS Sans Serif", "bold": true,
       "italic": false, "answer": {"size": 12, "name": "Liberation Sans", "bold": false,
       "italic": true}}})"));
-  EXPECT_EQ(answered, "Liberation Sans12");
+  EXPECT_EQ(Answered(), "Liberation Sans12");
   const Json cancelled = Event()["font"];
   EXPECT_TRUE(cancelled["answer"].is_null());
   EXPECT_FALSE(cancelled.contains("unexpected"));
-  EXPECT_EQ(answered, "(cancelled)");
+  EXPECT_EQ(Answered(), "(cancelled)");
   EXPECT_EQ(Event()["font"]["unexpected"], true);
   EXPECT_EQ(Refused("font 12 0 2 Sans"), "font: italic is 0 or 1");
   EXPECT_EQ(Refused("font 12 0 1"), "font: needs a name");
@@ -167,16 +169,16 @@ TEST_F(Answers, OfAFontDialogAreWholeFonts) {
 }
 
 TEST_F(Answers, OfASetUpDialogAreOrientations) {
-  OnDo([this](const Context& context) {
-    const auto chosen = context.platform.dialogs.PrinterSetup(Orientation::Portrait);
-    answered = chosen ? std::to_string(static_cast<int>(*chosen)) : "(cancelled)";
+  OnDo([](Workbench& bench) {
+    const auto chosen = bench.context.platform.dialogs.PrinterSetup(Orientation::Portrait);
+    bench.lblPlain.SetCaption(chosen ? std::to_string(static_cast<int>(*chosen)) : "(cancelled)");
   });
   DoAll({"setup landscape", "setup portrait", "setup-cancel"});
   EXPECT_EQ(Event(), Json::parse(R"({"setup": {"answer": "Landscape"}})"));
-  EXPECT_EQ(answered, "2");
+  EXPECT_EQ(Answered(), "2");
   EXPECT_EQ(Event(), Json::parse(R"({"setup": {"answer": "Portrait"}})"));
   EXPECT_EQ(Event(), Json::parse(R"({"setup": {"answer": null}})"));
-  EXPECT_EQ(answered, "(cancelled)");
+  EXPECT_EQ(Answered(), "(cancelled)");
   EXPECT_EQ(Event(), Json::parse(R"({"setup": {"answer": null, "unexpected": true}})"));
   EXPECT_EQ(Refused("setup sideways"), "setup: there is no orientation sideways");
 }
@@ -200,7 +202,8 @@ TEST_F(Answers, AreRefusedForAButtonThatNoBoxHas) {
 class EndlessBox : public WorkbenchTest {
  protected:
   void AskForEver() {
-    OnDo([](const Context& context) {
+    OnDo([](Workbench& bench) {
+      const Context& context = bench.context;
       context.channels.OpenRandom(Channel::Players, "Club.qza", kPlayerLength);
       for (;;) context.platform.boxes.Message({"Again ?", "Title", BoxStyle::InformationYesNo});
     });
@@ -221,7 +224,8 @@ TEST_F(EndlessBox, IsBrokenOffAfterTwentyAnswersThatNobodyPrepared) {
 TEST_F(EndlessBox, LeavesAProgramThatGoesOn) {
   AskForEver();
   Try("click cmdDo");
-  OnDo([](const Context& context) {
+  OnDo([](Workbench& bench) {
+    const Context& context = bench.context;
     EXPECT_THROW((void)context.channels.RecordCount(Channel::Players), RunTimeError);
     context.session.Grade = "A";
   });
@@ -230,7 +234,8 @@ TEST_F(EndlessBox, LeavesAProgramThatGoesOn) {
 }
 
 TEST_F(EndlessBox, CountsAnewInEachCommand) {
-  OnDo([](const Context& context) {
+  OnDo([](Workbench& bench) {
+    const Context& context = bench.context;
     for (int i = 0; i < 20; ++i) {
       context.platform.boxes.Message({"Again ?", "Title", BoxStyle::InformationYesNo});
     }
@@ -241,7 +246,8 @@ TEST_F(EndlessBox, CountsAnewInEachCommand) {
 }
 
 TEST_F(EndlessBox, IsNoneWhereEachBoxSaysSomethingElse) {
-  OnDo([](const Context& context) {
+  OnDo([](Workbench& bench) {
+    const Context& context = bench.context;
     for (int i = 0; i < 30; ++i) {
       context.platform.boxes.Message({std::to_string(i), "Title", BoxStyle::InformationYesNo});
     }
@@ -258,7 +264,8 @@ TEST_F(EndlessBox, MayBeAnInputBoxOrADialog) {
       [](const Context& context) { (void)context.platform.dialogs.File(kOpenDialog); },
       [](const Context& context) { (void)context.platform.dialogs.Font({}); }};
   for (const auto& ask : asking) {
-    OnDo([ask](const Context& context) {
+    OnDo([ask](Workbench& bench) {
+      const Context& context = bench.context;
       for (;;) ask(context);
     });
     EXPECT_EQ(Try("click cmdDo")["ok"], false);

@@ -1,6 +1,8 @@
 #include "session/sort_pass.h"
 
 #include <algorithm>
+#include <span>
+#include <unordered_set>
 #include <vector>
 
 #include "data/gap_sort.h"
@@ -8,6 +10,9 @@
 
 namespace marlowbeck {
 namespace {
+
+/// Small enough to stay in the processor's cache between reading and writing.
+constexpr std::size_t kBlockRecords = 1024;
 
 /// The results as they lie on disk, and the date of each.
 struct Season {
@@ -29,13 +34,16 @@ Season ReadSeason(Channels& channels, const std::function<void(int)>& moved) {
 }
 
 /// The distinct dates in the order that the gap sort puts them in.
-std::vector<double> DistinctDates(std::vector<double> dates) {
-  const auto at = [&](int place) -> double& { return dates[static_cast<std::size_t>(place - 1)]; };
+std::vector<double> DistinctDates(const std::vector<double>& dates) {
+  const std::unordered_set<double> seen(dates.begin(), dates.end());
+  std::vector<double> distinct(seen.begin(), seen.end());
+  const auto at = [&](int place) -> double& {
+    return distinct[static_cast<std::size_t>(place - 1)];
+  };
   GapSort(
-      static_cast<int>(dates.size()), [&](int j, int k) { return !(at(j) > at(k)); },
+      static_cast<int>(distinct.size()), [&](int j, int k) { return !(at(j) > at(k)); },
       [&](int j, int k) { std::swap(at(j), at(k)); });
-  dates.erase(std::unique(dates.begin(), dates.end()), dates.end());
-  return dates;
+  return distinct;
 }
 
 /// Where each record's run of equal dates is to begin, then where its next record goes.
@@ -63,17 +71,31 @@ class Places {
   std::vector<std::size_t> next_;
 };
 
-std::vector<std::byte> InDateOrder(const Season& season) {
-  const std::vector<double> distinct = DistinctDates(season.dates);
-  Places places(distinct, season.dates);
-  std::vector<std::byte> sorted(season.records.size());
-  for (std::size_t record = 0; record < season.dates.size(); ++record) {
-    const auto from = season.records.begin() + static_cast<std::ptrdiff_t>(record * kResultLength);
-    const std::size_t place = places.Take(season.dates[record]);
-    std::copy_n(from, kResultLength,
-                sorted.begin() + static_cast<std::ptrdiff_t>(place * kResultLength));
+/// The number from 0 of the record that is to stand at each place.
+std::vector<std::size_t> DateOrder(const std::vector<double>& dates) {
+  const std::vector<double> distinct = DistinctDates(dates);
+  Places places(distinct, dates);
+  std::vector<std::size_t> order(dates.size());
+  for (std::size_t record = 0; record < dates.size(); ++record) {
+    order[places.Take(dates[record])] = record;
   }
-  return sorted;
+  return order;
+}
+
+/// Writes the records in that order, a block at a time.
+void WriteInOrder(Channels& channels, const Season& season, std::span<const std::size_t> order) {
+  std::vector<std::byte> block;
+  block.reserve(std::min(order.size(), kBlockRecords) * kResultLength);
+  for (std::size_t first = 0; first < order.size(); first += kBlockRecords) {
+    block.clear();
+    for (const std::size_t record :
+         order.subspan(first).first(std::min(kBlockRecords, order.size() - first))) {
+      const auto from =
+          season.records.begin() + static_cast<std::ptrdiff_t>(record * kResultLength);
+      block.insert(block.end(), from, from + kResultLength);
+    }
+    channels.PutRun(Channel::Side, static_cast<int>(first) + 1, block);
+  }
 }
 
 }  // namespace
@@ -83,9 +105,9 @@ void SortResults(Channels& channels, const std::string& results_file, const std:
   channels.OpenRandom(Channel::Results, results_file, kResultLength);
   const Season season = ReadSeason(channels, moved);
   channels.CloseAll();
-  const std::vector<std::byte> sorted = InDateOrder(season);
+  const std::vector<std::size_t> order = DateOrder(season.dates);
   channels.OpenRandom(Channel::Side, work_file, kResultLength);
-  channels.PutRun(Channel::Side, 1, sorted);
+  WriteInOrder(channels, season, order);
   channels.CloseAll();
   channels.Files().Replace(work_file, results_file);
 }

@@ -1,22 +1,21 @@
 // From starting the process to its first painted window: the program against an empty window.
+// Without a display both are drawn offscreen, where the empty window needs nothing of what a window
+// on a display needs: the ratio is larger there.
 
 #include <spawn.h>
 #include <sys/wait.h>
 
 #include <array>
-#include <cstdlib>
 #include <filesystem>
 #include <string>
 
 #include <QApplication>
-#include <QEvent>
-#include <QMainWindow>
-#include <QTimer>
-#include <QWidget>
 #include <benchmark/benchmark.h>
 
+#include "bench/first_paint.h"
 #include "bench/ratios.h"
 #include "desktop/desktop.h"
+#include "desktop/fonts_ahead.h"
 #include "desktop/theme.h"
 
 extern char** environ;
@@ -25,39 +24,18 @@ namespace marlowbeck::bench {
 namespace {
 
 constexpr const char* kProgram = "--program";
-constexpr const char* kEmptyWindow = "--empty-window";
 
-/// Ends the process once a window has been painted.
-class EndAfterFirstPaint : public QObject {
- public:
-  bool eventFilter(QObject* object, QEvent* event) override {
-    const auto* widget = qobject_cast<QWidget*>(object);
-    if (event->type() == QEvent::Paint && widget != nullptr && widget->window()->isVisible()) {
-      QTimer::singleShot(0, [] { std::_Exit(0); });
-    }
-    return false;
-  }
-};
-
-int ShowEmptyWindow() {
-  QMainWindow window;
-  window.resize(800, 600);
-  window.show();
-  return QApplication::exec();
-}
-
-int StartProgram(const std::string& folder) {
-  ApplyTheme();
-  Desktop desktop(folder, QString::fromStdString(folder));
-  return desktop.Start() ? QApplication::exec() : 1;
-}
-
-/// What a child process of this program does.
-int RunChild(int argc, char** argv) {
+/// What main() does, in a folder of the measurement's own.
+int StartProgram(int argc, char** argv) {
+  FontsAhead fonts;
   QApplication application(argc, argv);
   EndAfterFirstPaint end;
   application.installEventFilter(&end);
-  return std::string(argv[1]) == kProgram ? StartProgram(argv[2]) : ShowEmptyWindow();
+  ApplyTheme();
+  const std::string folder = argv[2];
+  Desktop desktop(folder, QString::fromStdString(folder));
+  fonts.Wait();
+  return desktop.Start() ? QApplication::exec() : 1;
 }
 
 std::string TemporaryFolder() {
@@ -66,26 +44,34 @@ std::string TemporaryFolder() {
   return pattern;
 }
 
-void StartOnce(benchmark::State& state, const char* what, std::string folder) {
-  std::string self = std::filesystem::read_symlink("/proc/self/exe").string();
-  std::string argument = what;
-  const std::array<char*, 4> arguments = {self.data(), argument.data(), folder.data(), nullptr};
+const std::filesystem::path& Self() {
+  static const std::filesystem::path self = std::filesystem::read_symlink("/proc/self/exe");
+  return self;
+}
+
+/// Runs a program of the two, which ends itself once its window is painted.
+void StartOnce(benchmark::State& state, const std::filesystem::path& program, std::string folder) {
+  std::string path = program.string();
+  std::string argument = kProgram;
+  const std::array<char*, 4> arguments = {path.data(), argument.data(), folder.data(), nullptr};
   pid_t child = 0;
   int status = 1;
-  if (posix_spawn(&child, self.c_str(), nullptr, nullptr, arguments.data(), environ) != 0 ||
+  if (posix_spawn(&child, path.c_str(), nullptr, nullptr, arguments.data(), environ) != 0 ||
       waitpid(child, &status, 0) != child || status != 0) {
     state.SkipWithError("the window did not come up");
   }
 }
 
 void EmptyWindow(benchmark::State& state) {
-  for (auto _ : state) StartOnce(state, kEmptyWindow, "");
+  for (auto _ : state) {
+    StartOnce(state, Self().parent_path() / "empty_window", "");
+  }
 }
 BENCHMARK(EmptyWindow)->Unit(benchmark::kMillisecond)->UseRealTime();
 
 void Start(benchmark::State& state) {
   const std::string folder = TemporaryFolder();
-  for (auto _ : state) StartOnce(state, kProgram, folder);
+  for (auto _ : state) StartOnce(state, Self(), folder);
   std::filesystem::remove_all(folder);
 }
 BENCHMARK(Start)->Unit(benchmark::kMillisecond)->UseRealTime();
@@ -95,7 +81,6 @@ BENCHMARK(Start)->Unit(benchmark::kMillisecond)->UseRealTime();
 
 int main(int argc, char** argv) {
   using namespace marlowbeck::bench;
-  const std::string first = argc > 1 ? argv[1] : "";
-  if (argc > 2 && (first == kProgram || first == kEmptyWindow)) return RunChild(argc, argv);
+  if (argc > 2 && std::string(argv[1]) == kProgram) return StartProgram(argc, argv);
   return RunAndCompare(argc, argv, {{"Start", "EmptyWindow", 1.5}});
 }

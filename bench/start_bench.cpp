@@ -32,8 +32,8 @@ int StartProgram(int argc, char** argv) {
   EndAfterFirstPaint end;
   application.installEventFilter(&end);
   ApplyTheme();
-  const std::string folder = argv[2];
-  Desktop desktop(folder, QString::fromStdString(folder));
+  const QString folder = QString::fromLocal8Bit(argv[2]);
+  Desktop desktop(folder, folder);
   fonts.Wait();
   return desktop.Start() ? QApplication::exec() : 1;
 }

@@ -96,6 +96,8 @@ struct frmDB : Screen {
   std::string AskForNewName();
   void CreateFile(const std::string& path, const std::string& carry_over_source);
   void CarryOver(const std::string& source);
+  void DropHalfMade();
+  bool MayBeNamed(const std::string& path);
   void AfterCreation();
   void WithOwnWords(const Handler& work);
   void NewCompetition();
@@ -109,6 +111,7 @@ struct frmDB : Screen {
   const Context& context_;
   Session& session_;
   std::array<Tile, 7> tiles_;
+  std::string half_made_;  ///< the file that New has made and not yet named
   bool pointer_on_tile_ = false;
 };
 

@@ -10,6 +10,7 @@ namespace marlowbeck {
 namespace {
 
 constexpr const char* kPattern = "*.qza";
+constexpr const char* kWorkFileEnding = ".new";
 
 /// The path that a file dialog came back with; empty when it was cancelled or left as it stood.
 std::string AskForFile(const Context& context, FileDialogRequest::Mode mode, const char* title) {
@@ -56,7 +57,33 @@ void frmDB::WithOwnWords(const Handler& work) {
 }
 
 void frmDB::mnuNew_Click() {
+  half_made_.clear();
   WithOwnWords([this] { NewCompetition(); });
+  DropHalfMade();
+}
+
+/// A competition that could not be made whole and named leaves nothing behind.
+void frmDB::DropHalfMade() {
+  if (half_made_.empty() || MayBeNamed(half_made_)) return;
+  FileSystem& files = context_.channels.Files();
+  try {
+    for (const std::string& file : {half_made_, half_made_ + kWorkFileEnding}) {
+      if (files.Exists(file)) files.Delete(file);
+    }
+  } catch (const RunTimeError&) {
+    context_.channels.AbandonAll();
+  }
+}
+
+/// The side file names that competition, or cannot be read. One that is missing names none.
+bool frmDB::MayBeNamed(const std::string& path) {
+  try {
+    ReadFileName(context_);
+    return session_.PlayerFile == path;
+  } catch (const RunTimeError& error) {
+    context_.channels.AbandonAll();
+    return ErrorNumber{error.Number()} != ErrorNumber::FileNotFound;
+  }
 }
 
 void frmDB::NewCompetition() {
@@ -112,11 +139,13 @@ std::string frmDB::AskForNewName() {
 
 void frmDB::CreateFile(const std::string& path, const std::string& carry_over_source) {
   session_.PlayerFile = path;
+  if (!context_.channels.Files().Exists(path)) half_made_ = path;
   OpenPlayerFile();
   const bool was_there = session_.PlayerCount > 0;
   if (!was_there && !carry_over_source.empty()) CarryOver(carry_over_source);
   // Only a file that could be made, and that is whole, becomes the open one.
   WriteFileName(context_);
+  half_made_.clear();
   if (!was_there) return AfterCreation();
   Warning(context_, Lines({"The file you are trying to create    ", "already exists.    "}),
           Beep::First);
@@ -138,7 +167,7 @@ void frmDB::ReopenNamedFile() {
 void frmDB::CarryOver(const std::string& source) {
   Channels& channels = context_.channels;
   channels.CloseAll();
-  const std::string work_file = session_.PlayerFile + ".new";
+  const std::string work_file = session_.PlayerFile + kWorkFileEnding;
   if (channels.Files().Exists(work_file)) channels.Files().Delete(work_file);
   channels.OpenRandom(Channel::Players, source, kPlayerLength);
   channels.OpenRandom(Channel::Results, work_file, kPlayerLength);

@@ -100,6 +100,12 @@ TEST(SortSweep, EachFailureLeavesOneOrderOrTheOther) {
   EXPECT_GT(SweepFailures(work), 8);
 }
 
+TEST(SortSweep, EachWriteCutShortLeavesOneOrderOrTheOther) {
+  SweptWork work = Sorting();
+  work.check = LeadBack;
+  EXPECT_GE(SweepCutWrites(work), 2);
+}
+
 TEST(SortSweep, EachPowerCutLeavesOneOrderOrTheOther) { EXPECT_GT(SweepPowerCuts(Sorting()), 8); }
 
 }  // namespace

@@ -409,6 +409,14 @@ TEST_F(FromTheScoreSheetTest, ExitGoesBackToTheScoreSheet) {
   EXPECT_FALSE(Loaded("frmNames"));
 }
 
+TEST_F(FromTheScoreSheetTest, AfterACancelledDeleteExitGoesToTheMenu) {
+  ComeFromTheScoreSheet();
+  DoAll({"pick cboAddTm =Rovers", "pick lstPlayers 0", "click cmdCancelDel"});
+  EXPECT_EQ(InSession("Flag"), 0);
+  Do("click cmdAddCancel");
+  EXPECT_EQ(Front(), "frmDB");
+}
+
 TEST_F(FromTheScoreSheetTest, AfterASaveExitGoesToTheMenu) {
   ComeFromTheScoreSheet();
   TypeNames("Evans", "Flo");

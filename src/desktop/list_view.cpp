@@ -41,6 +41,8 @@ void ListView::ShowLines() {
   shown_lines_ = model_.Lines();
   const int scrolled = list_.verticalScrollBar()->value();
   list_.clear();
+  // Told that there is no current line, the list makes none of its own when the focus comes.
+  list_.setCurrentIndex({});
   QStringList texts;
   for (const std::string& line : shown_lines_) texts.append(ToQt(line));
   list_.addItems(texts);
@@ -98,14 +100,13 @@ bool ListView::Pressed(const QWidget& on, const QMouseEvent& event) {
 void ListView::PressLine(int line, Qt::KeyboardModifiers modifiers) {
   if (model_.Multi() && modifiers.testFlag(Qt::ControlModifier)) {
     Do([=, this](Hand& hand) { return hand.Toggle(model_, line); });
-  } else if (model_.Multi() && modifiers.testFlag(Qt::ShiftModifier) && model_.Index() >= 0) {
-    std::vector<int> lines;
-    const int step = line < model_.Index() ? -1 : 1;
-    for (int i = model_.Index(); i != line; i += step) lines.push_back(i);
-    lines.push_back(line);
-    Do([&](Hand& hand) { return hand.Select(model_, lines); });
+    anchor_ = line;
+  } else if (model_.Multi() && modifiers.testFlag(Qt::ShiftModifier)) {
+    const int from = anchor_ >= 0 && anchor_ < model_.Count() ? anchor_ : line;
+    Do([=, this](Hand& hand) { return hand.MarkThrough(model_, from, line); });
   } else {
     Do([=, this](Hand& hand) { return hand.Pick(model_, line); });
+    anchor_ = line;
   }
 }
 

@@ -32,6 +32,7 @@ class ListView : public CaptionedView {
   QListWidget& list_;
   std::vector<std::string> shown_lines_;
   int shown_line_ = -1;
+  int anchor_ = -1;  ///< where a shift-click begins
 };
 
 }  // namespace marlowbeck

@@ -1,3 +1,4 @@
+#include <algorithm>
 #include <array>
 #include <string_view>
 #include <utility>
@@ -58,9 +59,14 @@ ActionReader ControlAndLine(Verb verb) {
   };
 }
 
+/// A line that is named twice is marked once: the second click would unmark it.
 Action ReadSelect(World& world, Arguments& arguments) {
   Action action = On(Verb::Select, TakeControl(arguments, world.GetScreens()));
-  while (!arguments.AtEnd()) action.numbers.push_back(arguments.Number("a line", 0));
+  while (!arguments.AtEnd()) {
+    const int line = arguments.Number("a line", 0);
+    const auto& known = action.numbers;
+    if (std::find(known.begin(), known.end(), line) == known.end()) action.numbers.push_back(line);
+  }
   return action;
 }
 

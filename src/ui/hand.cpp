@@ -162,38 +162,52 @@ Outcome Hand::PickTwice(Control& control, int line) {
   return Twice(control, [&] { return Pick(control, line); });
 }
 
-Outcome Hand::Select(Control& control, const std::vector<int>& lines) {
-  if (const Outcome check = CheckLive(control); !check.Done()) return check;
-  auto* const list = As<ListBox>(control);
+/// Why these lines of a list cannot be marked; empty when they can.
+Outcome Hand::CheckMarking(Control& control, const std::vector<int>& lines) {
+  if (Outcome check = CheckLive(control); !check.Done()) return check;
+  const auto* const list = As<ListBox>(control);
   if (list == nullptr || !list->Multi()) return Refused(control, "marks one line only");
   for (const int line : lines) {
     if (line < 0 || line >= list->Count()) return Refused(control, "has no such line");
   }
-  return Act(control, [&] {
-    if (lines.empty()) {
-      const std::set<int> marked = list->Marked();
-      for (const int line : marked) {
-        list->SetMarked(line, false);
-        list->SetIndex(line);
-      }
-      return;
-    }
-    list->ClearMarks();
-    for (const int line : lines) {
-      list->SetMarked(line, true);
-      list->SetIndex(line);
-    }
-  });
+  return {};
+}
+
+Outcome Hand::Select(Control& control, const std::vector<int>& lines) {
+  if (Outcome check = CheckMarking(control, lines); !check.Done()) return check;
+  const auto held = screens_.Hold(control.InScreen());
+  const std::set<int> marked = static_cast<ListBox&>(control).Marked();
+  std::vector<int> clicks = lines.empty() ? std::vector<int>(marked.begin(), marked.end()) : lines;
+  Outcome outcome;
+  for (std::size_t i = 0; i < clicks.size() && !outcome.lost; ++i) {
+    Outcome click =
+        i == 0 && !lines.empty() ? Pick(control, clicks[i]) : Toggle(control, clicks[i]);
+    if (!click.Done()) break;
+    outcome = std::move(click);
+  }
+  return outcome;
 }
 
 Outcome Hand::Toggle(Control& control, int line) {
-  if (const Outcome check = CheckLive(control); !check.Done()) return check;
-  auto* const list = As<ListBox>(control);
-  if (list == nullptr || !list->Multi()) return Refused(control, "marks one line only");
-  if (line < 0 || line >= list->Count()) return Refused(control, "has no such line");
-  return Act(control, [=] {
-    list->SetMarked(line, !list->Marked().contains(line));
-    list->SetIndex(line);
+  if (Outcome check = CheckMarking(control, {line}); !check.Done()) return check;
+  auto& list = static_cast<ListBox&>(control);
+  return Act(control, [&list, line] {
+    if (line >= list.Count()) return;
+    list.SetMarked(line, !list.Marked().contains(line));
+    list.SetIndex(line);
+  });
+}
+
+Outcome Hand::MarkThrough(Control& control, int from, int to) {
+  if (Outcome check = CheckMarking(control, {from, to}); !check.Done()) return check;
+  auto& list = static_cast<ListBox&>(control);
+  return Act(control, [&list, from, to] {
+    if (std::max(from, to) >= list.Count()) return;
+    list.ClearMarks();
+    for (int line = std::min(from, to); line <= std::max(from, to); ++line) {
+      list.SetMarked(line, true);
+    }
+    list.SetIndex(to);
   });
 }
 

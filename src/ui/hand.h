@@ -39,10 +39,13 @@ class Hand {
   Outcome Retype(Control& control, std::string_view text);
   Outcome Pick(Control& control, int line);
   Outcome PickTwice(Control& control, int line);
-  /// Marks just these lines of a list, by click and control-click.
+  /// Marks just these lines of a list: a click on the first and a control-click on each other one.
+  /// None unmarks all. It ends where a click takes the list away.
   Outcome Select(Control& control, const std::vector<int>& lines);
   /// A control-click: marks a line of a list, or takes its mark away.
   Outcome Toggle(Control& control, int line);
+  /// A shift-click on `to`: marks just the lines from `from` to there.
+  Outcome MarkThrough(Control& control, int from, int to);
   /// The keyboard goes to a line of a list, other than by one step up or down.
   Outcome MoveToLine(Control& control, int line);
   Outcome ClickCell(Control& control, int row, int col);
@@ -66,6 +69,7 @@ class Hand {
   void ClickWithFocus(Control& control);
   void PressOn(Control* focus, Screen& front, Key key);
   void PressEnter(Control* focus, Screen& front);
+  static Outcome CheckMarking(Control& control, const std::vector<int>& lines);
   static void PickLine(LineHolder& list, int line);
   void MoveLine(LineHolder& list, int step);
   void GoToLine(LineHolder& list, int line);

@@ -138,6 +138,52 @@ TEST_F(Acting, SelectMarksJustTheseLines) {
   EXPECT_EQ(Get("lstMany")["selected"], Json::array());
 }
 
+TEST_F(Acting, SelectClicksOnEachLineOnce) {
+  EXPECT_EQ(ToldBy("select lstMany 1 1"), "lstMany clicked;");
+  EXPECT_EQ(ToldBy("select lstMany 2 0 2"), "lstMany clicked;lstMany clicked;");
+  EXPECT_EQ(Index("lstMany"), 0);
+  EXPECT_EQ(ToldBy("select lstMany"), "lstMany clicked;lstMany clicked;");
+  EXPECT_EQ(ToldBy("select lstMany"), "");
+}
+
+TEST_F(Acting, SelectThatUnmarksNothingClicksOnNothing) {
+  Do("focus cmdDo");
+  Do("select lstMany");
+  EXPECT_EQ(Focus(), "frmBench.cmdDo");
+}
+
+TEST_F(Acting, SelectEndsWhereAClickTakesTheListAway) {
+  Change([](Workbench& bench) {
+    bench.lstMany.Click = [&bench] {
+      bench.Tell("clicked");
+      bench.lstMany.Disable();
+    };
+  });
+  EXPECT_EQ(ToldBy("select lstMany 0 1 2"), "clicked;");
+  EXPECT_EQ(Get("lstMany")["selected"], Json::parse("[0]"));
+}
+
+TEST_F(Acting, SelectEndsWhereAClickTakesTheLinesAway) {
+  Change([](Workbench& bench) { bench.lstMany.Click = [&bench] { bench.lstMany.Clear(); }; });
+  Do("select lstMany 0 1 2");
+  EXPECT_EQ(Lines("lstMany"), TextList{});
+}
+
+TEST_F(Acting, TheFocusMakesNoLineTheCurrentOne) {
+  for (const char* list : {"lstOne", "lstMany", "drvDrives", "dirFolders", "filFiles"}) {
+    Do(std::string("focus ") + list);
+    EXPECT_EQ(Index(list), -1) << list;
+  }
+  Do("key Tab");
+  Do("key Shift+Tab");
+  EXPECT_EQ(Index("filFiles"), -1);
+  Change([](Workbench& bench) {
+    bench.filFiles.Clear();
+    bench.filFiles.AddLine("anew");
+  });
+  EXPECT_EQ(Index("filFiles"), -1);
+}
+
 TEST_F(Acting, SelectIsRefusedWhereOneLineIsMarkedOrNoneIsThere) {
   EXPECT_EQ(Refused("select lstOne 0"), "lstOne marks one line only");
   EXPECT_EQ(Refused("select lstMany 0 3"), "lstMany has no such line");

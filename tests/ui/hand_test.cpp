@@ -174,6 +174,19 @@ TEST_F(HandTest, APickInAListThatMarksSeveralMarksThatLineAlone) {
   EXPECT_FALSE(hand.Select(a.lstA, {3}).Done());
 }
 
+TEST_F(HandTest, AShiftClickMarksAllLinesUpToItWithOneClick) {
+  FillList();
+  EXPECT_FALSE(hand.MarkThrough(a.lstA, 0, 1).Done()) << "it marks one line only";
+  a.lstA.SetMulti(true);
+  hand.Pick(a.lstA, 0);
+  log.clear();
+  hand.MarkThrough(a.lstA, 2, 1);
+  EXPECT_EQ(a.lstA.Marked(), (std::set<int>{1, 2}));
+  EXPECT_EQ(a.lstA.Index(), 1);
+  EXPECT_EQ(Happened(), Log{"click lstA"});
+  EXPECT_FALSE(hand.MarkThrough(a.lstA, 0, 3).Done());
+}
+
 TEST_F(HandTest, ADoubleClickComesAfterItsClick) {
   hand.DoubleClick(a.cmdA);
   EXPECT_EQ(Happened(), (Log{"lost txtA", "got cmdA", "click cmdA", "dblclick cmdA"}));

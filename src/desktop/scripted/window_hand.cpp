@@ -317,16 +317,22 @@ Outcome WindowHand::Select(Control& control, const std::vector<int>& lines) {
       return Refused(control, "has no such line");
     }
   }
+  const auto held = windows_.GetScreens().Hold(control.InScreen());
+  const std::vector<int>& clicks = lines.empty() ? *state.selected : lines;
   Outcome outcome;
-  if (lines.empty()) {
-    for (const int line : *state.selected) outcome = PickInList(view, line, Qt::ControlModifier);
-  }
-  for (std::size_t i = 0; i < lines.size() && !outcome.lost; ++i) {
-    const auto done = lines.begin() + static_cast<std::ptrdiff_t>(i);
-    if (std::find(lines.begin(), done, lines[i]) != done) continue;
-    outcome = PickInList(view, lines[i], i == 0 ? Qt::NoModifier : Qt::ControlModifier);
+  for (std::size_t i = 0; i < clicks.size() && !outcome.lost; ++i) {
+    if (!HasLine(control, clicks[i])) break;  // a click has taken it away
+    const bool first = i == 0 && !lines.empty();
+    outcome = PickInList(view, clicks[i], first ? Qt::NoModifier : Qt::ControlModifier);
   }
   return outcome;
+}
+
+/// The list can still be acted on and has the line.
+bool WindowHand::HasLine(const Control& control, int line) const {
+  if (windows_.WindowOf(control.InScreen()) == nullptr || !CheckLive(control).Done()) return false;
+  const auto lines = ViewOf(control).Read().lines;
+  return lines && line < static_cast<int>(lines->size());
 }
 
 Outcome WindowHand::Cell(Control& control, int row, int col) {

@@ -43,6 +43,7 @@ class WindowHand {
 
   [[nodiscard]] View& ViewOf(const Control& control) const;
   [[nodiscard]] Outcome CheckLive(const Control& control) const;
+  [[nodiscard]] bool HasLine(const Control& control, int line) const;
   [[nodiscard]] std::optional<Place> FreePlace(View& view) const;
   Outcome ClickAt(const std::optional<Place>& place, const Control& control,
                   Qt::KeyboardModifiers modifiers = Qt::NoModifier);

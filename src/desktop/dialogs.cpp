@@ -5,6 +5,7 @@
 #include <QFileDialog>
 #include <QFontDialog>
 
+#include "data/runtime_error.h"
 #include "desktop/encoding.h"
 #include "desktop/printer_setup.h"
 
@@ -28,6 +29,13 @@ void DressFileDialog(QFileDialog& dialog, const FileDialogRequest& request) {
   if (!request.name.empty() && !IsPattern(request.name)) dialog.selectFile(ToQt(request.name));
 }
 
+/// A path with letters that the program has not would be another file's.
+std::string InTheProgramsLetters(const QString& path) {
+  std::string text = FromQt(path);
+  if (ToQt(text) != path) throw RunTimeError(ErrorNumber::BadFileName);
+  return text;
+}
+
 }  // namespace
 
 std::optional<std::string> DesktopDialogs::File(const FileDialogRequest& request) {
@@ -35,7 +43,7 @@ std::optional<std::string> DesktopDialogs::File(const FileDialogRequest& request
   QFileDialog dialog(QApplication::activeWindow());
   DressFileDialog(dialog, request);
   if (dialog.exec() != QDialog::Accepted || dialog.selectedFiles().isEmpty()) return std::nullopt;
-  return FromQt(QDir::toNativeSeparators(dialog.selectedFiles().constFirst()));
+  return InTheProgramsLetters(QDir::toNativeSeparators(dialog.selectedFiles().constFirst()));
 }
 
 std::optional<FontChoice> DesktopDialogs::Font(const FontChoice& present) {

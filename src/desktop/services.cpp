@@ -11,6 +11,8 @@
 #include <QScreen>
 #include <QTimer>
 #ifdef MARLOWBECK_MULTIMEDIA
+#include <QAudioDevice>
+#include <QMediaDevices>
 #include <QSoundEffect>
 #endif
 
@@ -49,29 +51,37 @@ QString DesktopSound::WavePath() const {
 }
 
 #ifdef MARLOWBECK_MULTIMEDIA
-/// Waits for the end, but never for long: a machine without a voice must not hold up a save.
+namespace {
+
+/// Plays a sound and waits for its end, but never for long.
+void PlayToTheEnd(QSoundEffect& effect) {
+  QEventLoop loop;
+  const auto leave = [&] {
+    if (!effect.isPlaying() || effect.status() == QSoundEffect::Error) loop.quit();
+  };
+  QObject::connect(&effect, &QSoundEffect::playingChanged, &loop, leave);
+  QObject::connect(&effect, &QSoundEffect::statusChanged, &loop, leave);
+  QTimer::singleShot(kLongestSound, &loop, &QEventLoop::quit);
+  effect.play();
+  if (effect.isPlaying()) loop.exec(QEventLoop::ExcludeUserInputEvents);
+}
+
+}  // namespace
+
+/// A machine without a voice must not hold up a save.
 void DesktopSound::Play() {
   const QString path = WavePath();
   if (mute_ || path.isEmpty()) return;
   if (player_ == nullptr) {
+    mute_ = QMediaDevices::defaultAudioOutput().isNull();
+    if (mute_) return;
     auto effect = std::make_unique<QSoundEffect>();
     effect->setSource(QUrl::fromLocalFile(path));
     player_ = std::move(effect);
   }
   auto& effect = static_cast<QSoundEffect&>(*player_);
-  QEventLoop loop;
-  bool heard = false;
-  QObject::connect(&effect, &QSoundEffect::playingChanged, &loop, [&] {
-    heard = heard || effect.isPlaying();
-    if (!effect.isPlaying()) loop.quit();
-  });
-  QObject::connect(&effect, &QSoundEffect::statusChanged, &loop, [&] {
-    if (effect.status() == QSoundEffect::Error) loop.quit();
-  });
-  QTimer::singleShot(kLongestSound, &loop, &QEventLoop::quit);
-  effect.play();
-  if (effect.status() != QSoundEffect::Error) loop.exec(QEventLoop::ExcludeUserInputEvents);
-  mute_ = !heard;
+  PlayToTheEnd(effect);
+  mute_ = effect.status() == QSoundEffect::Error;
 }
 #else
 void DesktopSound::Play() {}

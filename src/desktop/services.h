@@ -33,12 +33,14 @@ class DesktopSound : public Sound {
 
   /// Where the prepared file lies; empty when it lies nowhere.
   [[nodiscard]] QString WavePath() const;
+  /// Whether it has turned out that nothing can be heard.
+  [[nodiscard]] bool Mute() const { return mute_; }
 
  private:
   QStringList folders_;
   std::string wave_file_;
   std::unique_ptr<QObject> player_;
-  bool mute_ = false;  ///< found out at the first sound: no other is waited for
+  bool mute_ = false;  ///< found out at the first sound: no other is tried
 };
 
 class DesktopClock : public Clock {

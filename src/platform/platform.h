@@ -87,6 +87,7 @@ class Dialogs {
  public:
   virtual ~Dialogs() = default;
   /// The full path chosen; the name asked with when it was left as it stood; nothing if cancelled.
+  /// Throws BadFileName for a path that no text of the program can hold.
   virtual std::optional<std::string> File(const FileDialogRequest& request) = 0;
   virtual std::optional<FontChoice> Font(const FontChoice& present) = 0;
   virtual std::optional<Orientation> PrinterSetup(Orientation present) = 0;

@@ -41,7 +41,7 @@ void PanelView::ShowKind() {
     label->setText(ToQt(caption));
     label->setAccessibleName(Spoken(Trimmed(caption)));
     if (label->frameShape() == QFrame::NoFrame) TakeNoRoomForBlanks(*label);
-  } else {
+  } else if (Buddy() == nullptr) {
     Widget()->setWindowTitle(ToQt(caption));  // nowhere to be seen, but there to be read
   }
 }
@@ -49,7 +49,7 @@ void PanelView::ShowKind() {
 /// A panel that comes up stands over those that lie in the same place.
 void PanelView::ShowCommon() {
   const bool comes_up = GetControl().Visible() && Widget()->isHidden();
-  View::ShowCommon();
+  CaptionedView::ShowCommon();
   if (comes_up) Widget()->raise();
 }
 
@@ -58,6 +58,8 @@ void PanelView::ReadKind(ControlState& state) const {
     state.caption = FromMnemonicText(group->title());
   } else if (const auto* const label = qobject_cast<const QLabel*>(Widget())) {
     state.caption = FromQt(label->text());
+  } else if (Buddy() != nullptr) {
+    state.caption = FromMnemonicText(Buddy()->text());
   } else {
     state.caption = FromQt(Widget()->windowTitle());
   }

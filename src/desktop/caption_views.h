@@ -3,20 +3,20 @@
 #include <QAbstractButton>
 #include <QAction>
 #include <QGroupBox>
-#include <QLabel>
 #include <QProgressBar>
 
+#include "desktop/captioned_view.h"
 #include "desktop/picture_button.h"
-#include "desktop/view.h"
 #include "ui/controls.h"
 
 namespace marlowbeck {
 
 // The kinds that say little more than their caption.
 
-class PanelView : public View {
+/// The caption is a group's title, a label's text or that of a label of the form.
+class PanelView : public CaptionedView {
  public:
-  PanelView(Control& control, QWidget* widget, Windows& windows) : View(control, widget, windows) {}
+  using CaptionedView::CaptionedView;
 
  protected:
   void ShowKind() override;

@@ -2,25 +2,12 @@
 
 #include <QComboBox>
 #include <QDateEdit>
-#include <QLabel>
 #include <QLineEdit>
 
-#include "desktop/view.h"
+#include "desktop/captioned_view.h"
 #include "ui/controls.h"
 
 namespace marlowbeck {
-
-/// What has its caption in a label beside it, which is shown and live as it is itself.
-class CaptionedView : public View {
- public:
-  CaptionedView(Control& control, QWidget* widget, Windows& windows);
-
- protected:
-  void ShowCommon() override;
-
- private:
-  QLabel* buddy_;
-};
 
 class TextView : public CaptionedView {
  public:

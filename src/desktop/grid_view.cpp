@@ -1,7 +1,10 @@
 #include "desktop/grid_view.h"
 
+#include <numeric>
+
 #include <QHeaderView>
 #include <QPainter>
+#include <QRegularExpression>
 #include <QScrollBar>
 #include <QStyledItemDelegate>
 
@@ -12,6 +15,13 @@ namespace {
 
 /// The column that is current while the heading row is.
 constexpr const char* kHeadingColumn = "headingColumn";
+/// A property of the form: how many rows are seen, as far as there are that many, in the smallest
+/// window.
+constexpr const char* kLeastRows = "leastRows";
+
+constexpr int kRowHeight = 24;  // pixels
+constexpr int kAir = 8;         ///< between columns, at the least
+constexpr int kLeastNames = 120;
 
 /// Rules between rows only.
 class RuledDelegate : public QStyledItemDelegate {
@@ -24,6 +34,8 @@ class RuledDelegate : public QStyledItemDelegate {
     painter->drawLine(option.rect.bottomLeft(), option.rect.bottomRight());
   }
 };
+
+std::size_t AsIndex(int number) { return static_cast<std::size_t>(number); }
 
 std::vector<std::vector<std::string>> CellsOf(const Grid& grid) {
   std::vector<std::vector<std::string>> cells(static_cast<std::size_t>(grid.Rows()));
@@ -53,9 +65,11 @@ GridView::GridView(Grid& control, QTableWidget* table, Windows& windows)
   table_.setHorizontalScrollMode(QAbstractItemView::ScrollPerPixel);
   table_.verticalHeader()->hide();
   table_.verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
-  table_.verticalHeader()->setDefaultSectionSize(26);
+  table_.verticalHeader()->setMinimumSectionSize(kRowHeight);
+  table_.verticalHeader()->setDefaultSectionSize(kRowHeight);
   table_.horizontalHeader()->setHighlightSections(false);
   table_.horizontalHeader()->setFocusPolicy(Qt::NoFocus);
+  table_.viewport()->installEventFilter(this);
 }
 
 Qt::Alignment GridView::AlignmentOf(int col) const {
@@ -76,13 +90,60 @@ void GridView::ShowKind() {
   ShowCurrent();
 }
 
-/// As wide as the widest cell, and some air.
+/// As wide as the widest cell, and what is left is shared out. Where the room is short, names are
+/// broken into two lines before anything has to be scrolled.
 void GridView::FitColumns() {
-  constexpr int kAir = 14;  // pixels
-  table_.resizeColumnsToContents();
-  for (int col = 0; col < table_.columnCount(); ++col) {
-    table_.setColumnWidth(col, table_.columnWidth(col) + kAir);
+  const int cols = table_.columnCount();
+  if (cols == 0) return;
+  std::vector<int> widths;
+  for (int col = 0; col < cols; ++col) widths.push_back(WidthOfColumn(col));
+  const int spare = table_.viewport()->width() - std::accumulate(widths.begin(), widths.end(), 0);
+  if (spare >= 0) {
+    for (int col = 0; col < cols; ++col)
+      widths[AsIndex(col)] += spare / cols + (col < spare % cols);
+  } else if (model_.FiguresFrom() > 0) {
+    widths[0] = std::max(widths[0] + spare, std::min(widths[0], LeastWidthOfNames()));
   }
+  for (int col = 0; col < cols; ++col) table_.setColumnWidth(col, widths[AsIndex(col)]);
+  FitRows();
+}
+
+int GridView::WidthOfColumn(int col) const {
+  const int heading = table_.horizontalHeader()->sectionSizeHint(col);
+  return std::max(heading, AsView().sizeHintForColumn(col)) + kAir;
+}
+
+/// No word is broken.
+int GridView::LeastWidthOfNames() const {
+  static const QRegularExpression kBreak("(?<=-)|\\s");
+  int least = kLeastNames;
+  for (int row = 0; row < table_.rowCount(); ++row) {
+    for (const QString& word : table_.item(row, 0)->text().split(kBreak)) {
+      least = std::max(least, table_.fontMetrics().horizontalAdvance(word) + 2 * kAir);
+    }
+  }
+  return least;
+}
+
+/// A row is as high as its name takes.
+void GridView::FitRows() {
+  int height = 2 * table_.frameWidth() + table_.horizontalHeader()->sizeHint().height();
+  const int least_rows = table_.property(kLeastRows).toInt();
+  int least = height;
+  for (int row = 0; row < table_.rowCount(); ++row) {
+    table_.setRowHeight(row, std::max(kRowHeight, AsView().sizeHintForRow(row)));
+    height += table_.rowHeight(row);
+    if (row < least_rows) least = height;
+  }
+  if (least_rows == 0) return;
+  table_.setMinimumHeight(least);
+  table_.setMaximumHeight(height);
+}
+
+/// The room for the columns has changed.
+bool GridView::eventFilter(QObject* watched, QEvent* event) {
+  if (watched == table_.viewport() && event->type() == QEvent::Resize) FitColumns();
+  return CaptionedView::eventFilter(watched, event);
 }
 
 void GridView::ShowHeading() {

@@ -7,7 +7,9 @@
 
 namespace marlowbeck {
 
-/// A grid: its heading row is a header that stays, names stand left and figures right.
+/// A grid: its heading row is a header that stays, names stand left and figures right. A table of
+/// the form whose property `leastRows` is a number shows that many of its rows in any window, and
+/// is never higher than all of them.
 class GridView : public CaptionedView {
  public:
   GridView(Grid& control, QTableWidget* table, Windows& windows);
@@ -22,7 +24,13 @@ class GridView : public CaptionedView {
  private:
   void ShowCells();
   void ShowHeading();
+  bool eventFilter(QObject* watched, QEvent* event) override;
   void FitColumns();
+  void FitRows();
+  /// A table hides its measures, which are every view's.
+  [[nodiscard]] const QAbstractItemView& AsView() const { return table_; }
+  [[nodiscard]] int WidthOfColumn(int col) const;
+  [[nodiscard]] int LeastWidthOfNames() const;
   void ShowCurrent();
   void PressCell(int row, int col);
   [[nodiscard]] Qt::Alignment AlignmentOf(int col) const;

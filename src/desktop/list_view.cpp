@@ -11,7 +11,9 @@ ListView::ListView(ListBox& control, QListWidget* list, Windows& windows)
     : CaptionedView(control, list, windows), model_(control), list_(*list) {
   list_.setSelectionMode(model_.Multi() ? QAbstractItemView::MultiSelection
                                         : QAbstractItemView::SingleSelection);
-  list_.setUniformItemSizes(true);
+  // A long name takes two lines; nothing is scrolled sideways.
+  list_.setWordWrap(true);
+  list_.setResizeMode(QListView::Adjust);
   list_.setEditTriggers(QAbstractItemView::NoEditTriggers);
 }
 

@@ -34,6 +34,7 @@ constexpr int kButtonMargin = 16;
 constexpr int kMenuMargin = 8;
 constexpr int kEntryHeight = 30;
 constexpr int kLineHeight = 24;
+constexpr int kLineAir = 6;
 constexpr int kCardTitleIndent = 24;
 
 bool IsCard(const QWidget* widget) {
@@ -58,7 +59,8 @@ class Style : public QProxyStyle {
       case CT_SpinBox:
         return size.expandedTo({0, kEntryHeight});
       case CT_ItemViewItem:
-        return size.expandedTo({0, kLineHeight});
+        // Some air tells a line that is broken in two from two lines.
+        return (size + QSize(0, kLineAir)).expandedTo({0, kLineHeight});
       default:
         return size;
     }

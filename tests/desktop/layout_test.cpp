@@ -1,0 +1,98 @@
+// Every screen in every state that the scripts of tools/ bring it into, in the smallest window that
+// the program is made for and in a larger one.
+
+#include <filesystem>
+#include <fstream>
+
+#include <QApplication>
+#include <QRegularExpression>
+
+#include "support/club.h"
+#include "tests/desktop/layout_lint.h"
+
+namespace marlowbeck {
+namespace {
+
+namespace fs = std::filesystem;
+
+constexpr QSize kSmall(800, 600);
+constexpr QSize kWide(1280, 800);
+
+TestFace Windows() {
+  static int argc = 1;
+  static char name[] = "desktop-tests";
+  static char* argv[] = {name, nullptr};
+  return {"windows", [](BoxAnswers& answers) { return MakeWindowFace(answers, argc, argv); }};
+}
+
+std::vector<fs::path> Scripts() {
+  std::vector<fs::path> scripts = {MARLOWBECK_SOURCE_DIR "/tools/tour.drive"};
+  for (const auto& entry : fs::directory_iterator(MARLOWBECK_SOURCE_DIR "/tools/screens")) {
+    scripts.push_back(entry.path());
+  }
+  std::sort(scripts.begin(), scripts.end());
+  return scripts;
+}
+
+QWidget* WindowOf(const std::string& screen) {
+  for (QWidget* widget : QApplication::topLevelWidgets()) {
+    const bool is_it = widget->objectName() == QString::fromStdString(screen);
+    if (is_it && widget->isVisible()) return widget;
+  }
+  return nullptr;
+}
+
+/// A script played on a copy of the sample, with a look at the window in front after each line.
+class Layout : public testing::TestWithParam<fs::path> {
+ protected:
+  Layout() {
+    club_.today = *DateFromIso("2004-04-07");
+    for (const auto& entry : fs::directory_iterator(MARLOWBECK_SOURCE_DIR "/samples")) {
+      const fs::path name = entry.path().filename();
+      const bool is_data = name.string().starts_with("Winter") || name.extension() == ".qz3";
+      if (is_data) fs::copy_file(entry.path(), club_.FilePath(name.string()));
+    }
+    club_.NameOpenFile("Winter.qza");
+  }
+
+  void Play(const std::string& line) {
+    if (line.empty() || line.starts_with('#') || line.starts_with("shot")) return;
+    club_.Do(line);
+    const std::string front = club_.Front();
+    QWidget* const window = WindowOf(front);
+    ASSERT_NE(window, nullptr) << front;
+    for (const QSize size : {kWide, kSmall}) LookAt(*window, size, line);
+  }
+
+ private:
+  /// A small window keeps its own size.
+  void LookAt(QWidget& window, QSize size, const std::string& line) {
+    const bool is_small = window.sizeHint().width() < 700 && window.width() < kSmall.width();
+    if (!is_small) window.resize(size);
+    QApplication::processEvents();
+    for (const QString& fault : SizeFaults(window, size) + LayoutFaults(window)) {
+      const QString told = QString("%1 at %2 x %3").arg(fault).arg(size.width()).arg(size.height());
+      // What has been told once is not told at every line that follows.
+      if (told_.contains(told)) continue;
+      told_.append(told);
+      ADD_FAILURE() << told.toStdString() << " after \"" << line << "\"";
+    }
+  }
+
+  Club club_{{Windows()}};
+  QStringList told_;
+};
+
+TEST_P(Layout, CutsNothingAndCoversNothing) {
+  std::ifstream script(GetParam());
+  for (std::string line; std::getline(script, line) && !HasFatalFailure();) Play(line);
+}
+
+INSTANTIATE_TEST_SUITE_P(Of, Layout, testing::ValuesIn(Scripts()), [](const auto& script) {
+  std::string name = script.param.stem().string();
+  std::replace(name.begin(), name.end(), '-', '_');
+  return name;
+});
+
+}  // namespace
+}  // namespace marlowbeck

@@ -68,6 +68,7 @@ std::optional<Key> HandKeyOf(const QKeyEvent& event) {
 bool InputFilter::eventFilter(QObject* watched, QEvent* event) {
   switch (event->type()) {
     case QEvent::KeyPress:
+    case QEvent::KeyRelease:
     case QEvent::ShortcutOverride:
     case QEvent::MouseButtonPress:
     case QEvent::MouseButtonDblClick:
@@ -85,6 +86,8 @@ bool InputFilter::eventFilter(QObject* watched, QEvent* event) {
     case QEvent::KeyPress:
     case QEvent::ShortcutOverride:
       return Key(*watched, *window, *static_cast<QKeyEvent*>(event));
+    case QEvent::KeyRelease:
+      return KeyRelease(*static_cast<QKeyEvent*>(event));
     case QEvent::MouseButtonPress:
       return MousePress(*watched, *window, *static_cast<QMouseEvent*>(event));
     case QEvent::MouseButtonDblClick:
@@ -150,6 +153,14 @@ bool InputFilter::CommonKey(const QKeyEvent& event, const View* view) {
       break;
     }
   }
+  return true;
+}
+
+/// Lists want to know; a key that is held down comes up once.
+bool InputFilter::KeyRelease(const QKeyEvent& event) {
+  const Control* const focus = windows_.GetScreens().Focus();
+  if (event.isAutoRepeat() || focus == nullptr || !focus->KeyUp) return false;
+  windows_.Do(nullptr, [](Hand& hand) { return hand.Release(); });
   return true;
 }
 

@@ -20,6 +20,7 @@ class InputFilter : public QObject {
  private:
   bool Key(const QObject& watched, ScreenWindow& window, QKeyEvent& event);
   bool CommonKey(const QKeyEvent& event, const View* view);
+  bool KeyRelease(const QKeyEvent& event);
   bool MousePress(QObject& watched, ScreenWindow& window, const QMouseEvent& event);
   bool MouseRelease(const QObject& watched, ScreenWindow& window, const QMouseEvent& event);
   bool SecondPress(QObject& watched, ScreenWindow& window, const QMouseEvent& event);

@@ -65,7 +65,7 @@ Outcome ModelFace::Perform(const Action& action) {
     case Verb::PickDate:
       return hand.PickDate(*action.control, action.date);
     case Verb::Press:
-      return hand.Press(action.key);
+      return hand.Strike(action.key);
     case Verb::Mnemonic:
       return hand.PressMnemonic(action.letter);
     case Verb::Focus:

@@ -114,7 +114,7 @@ class Control {
   Handler GotFocus;
   Handler LostFocus;
   Handler MouseMove;
-  Handler KeyUp;  ///< after a key that moved the line of a list
+  Handler KeyUp;  ///< a key has come up in a list
 
   /// Runs a handler of this control, if there is one, through the dispatcher.
   void Fire(const Handler& handler) const;

@@ -276,6 +276,21 @@ Outcome Hand::Press(Key key) {
   return Whole([&] { PressOn(front->Focus(), *front, key); });
 }
 
+Outcome Hand::Release() {
+  const Control* const focus = screens_.Ended() ? nullptr : screens_.Focus();
+  if (focus == nullptr || dynamic_cast<const ListBox*>(focus) == nullptr) return {};
+  screens_.GetDispatcher().Run([focus] { focus->Fire(focus->KeyUp); });
+  screens_.Settle();
+  return {};
+}
+
+Outcome Hand::Strike(Key key) {
+  const long boxes_before = boxes_.Shown();
+  Outcome outcome = Press(key);
+  if (outcome.Done() && boxes_.Shown() == boxes_before) Release();
+  return outcome;
+}
+
 void Hand::PressOn(Control* focus, Screen& front, Key key) {
   switch (key) {
     case Key::Enter:
@@ -332,7 +347,6 @@ void Hand::GoToLine(LineHolder& list, int line) {
     box->SetCursor(target);
   } else if (target != list.Index()) {
     PickLine(list, target);
-    list.Fire(list.KeyUp);
   }
 }
 

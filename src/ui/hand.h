@@ -51,7 +51,12 @@ class Hand {
   Outcome ClickCell(Control& control, int row, int col);
   Outcome DoubleClickCell(Control& control, int row, int col);
   Outcome PickDate(Control& control, Date date);
+  /// A key goes down.
   Outcome Press(Key key);
+  /// A key comes up, in whatever has the focus by then.
+  Outcome Release();
+  /// A key goes down and comes up again. One that called up a box comes up in that.
+  Outcome Strike(Key key);
   /// The mnemonic of a letter: the command with it, or a menu, and then an entry of that menu.
   Outcome PressMnemonic(char letter);
   /// The menu that a mnemonic dropped down has gone again.

@@ -315,9 +315,48 @@ TEST_F(HandTest, ArrowsMoveTheLineOfAList) {
   log.clear();
   hand.Press(Key::Down);
   EXPECT_EQ(a.lstA.Index(), 0);
-  EXPECT_EQ(Happened(), (Log{"click lstA", "keyup lstA"}));
+  EXPECT_EQ(Happened(), Log{"click lstA"});
   hand.Press(Key::Up);
   EXPECT_EQ(Happened(), Log{}) << "it stands on the first line already";
+}
+
+TEST_F(HandTest, AnyKeyThatComesUpInAListTellsIt) {
+  FillList();
+  hand.Focus(a.lstA);
+  log.clear();
+  hand.Strike(Key::Down);
+  EXPECT_EQ(Happened(), (Log{"click lstA", "keyup lstA"}));
+  hand.Strike(Key::Up);
+  EXPECT_EQ(Happened(), Log{"keyup lstA"}) << "it stands on the first line already";
+  hand.Strike(Key::Enter);
+  EXPECT_EQ(Happened(), Log{"keyup lstA"});
+}
+
+TEST_F(HandTest, AKeyComesUpWhereTheFocusIsByThen) {
+  hand.Focus(a.other);
+  log.clear();
+  hand.Strike(Key::Tab);
+  EXPECT_EQ(Happened(), (Log{"lost other", "got lstA", "keyup lstA"}));
+  hand.Strike(Key::Tab);
+  EXPECT_EQ(Happened(), (Log{"lost lstA", "got grdA"})) << "only lists want to know";
+}
+
+TEST_F(HandTest, AKeyThatCallsUpABoxComesUpInThat) {
+  FillList();
+  hand.Focus(a.lstA);
+  a.lstA.Click = [this] { Box("none"); };
+  log.clear();
+  hand.Strike(Key::Down);
+  EXPECT_EQ(Happened(), Log{"box none"});
+}
+
+TEST_F(HandTest, AKeyOfAListThatIsGoneTellsNobody) {
+  FillList();
+  hand.Focus(a.lstA);
+  a.lstA.Click = [this] { screens.Unload(a); };
+  log.clear();
+  hand.Strike(Key::Down);
+  EXPECT_EQ(Happened(), Log{"unload frmA"});
 }
 
 TEST_F(HandTest, AnArrowInAnEmptyListDoesNothing) {

@@ -42,13 +42,20 @@ void MoveMouse(QWidget& widget, QPoint at) {
   SendMouse(widget, QEvent::MouseMove, at, Qt::NoButton, Qt::NoButton, Qt::NoModifier);
 }
 
-void PressKey(QWidget& widget, int key, Qt::KeyboardModifiers modifiers, const QString& text) {
-  const QPointer<QWidget> still_there(&widget);
+void KeyDown(QWidget& widget, int key, Qt::KeyboardModifiers modifiers, const QString& text) {
   QKeyEvent press(QEvent::KeyPress, key, modifiers, text);
   QApplication::sendEvent(&widget, &press);
-  if (!still_there) return;
+}
+
+void KeyUp(QWidget& widget, int key, Qt::KeyboardModifiers modifiers, const QString& text) {
   QKeyEvent release(QEvent::KeyRelease, key, modifiers, text);
   QApplication::sendEvent(&widget, &release);
+}
+
+void PressKey(QWidget& widget, int key, Qt::KeyboardModifiers modifiers, const QString& text) {
+  const QPointer<QWidget> still_there(&widget);
+  KeyDown(widget, key, modifiers, text);
+  if (still_there) KeyUp(widget, key, modifiers, text);
 }
 
 void TypeOver(QWidget& entry, const QString& text) {

@@ -15,6 +15,11 @@ void ClickMouse(QWidget& widget, QPoint at, Qt::KeyboardModifiers modifiers = Qt
 void ClickMouseAgain(QWidget& widget, QPoint at);
 void MoveMouse(QWidget& widget, QPoint at);
 
+void KeyDown(QWidget& widget, int key, Qt::KeyboardModifiers modifiers = Qt::NoModifier,
+             const QString& text = {});
+void KeyUp(QWidget& widget, int key, Qt::KeyboardModifiers modifiers = Qt::NoModifier,
+           const QString& text = {});
+/// Down and up again.
 void PressKey(QWidget& widget, int key, Qt::KeyboardModifiers modifiers = Qt::NoModifier,
               const QString& text = {});
 /// Replaces the text of an entry.

@@ -52,7 +52,7 @@ void WindowFace::Attach(Program& program) {
   windows_ = std::make_unique<Windows>(program.GetScreens(), program.GetHand(), nullptr);
   windows_->KeepFailures();
   filter_ = std::make_unique<InputFilter>(*windows_);
-  hand_ = std::make_unique<WindowHand>(*windows_);
+  hand_ = std::make_unique<WindowHand>(*windows_, boxes_);
   qApp->installEventFilter(filter_.get());
 }
 

@@ -78,6 +78,12 @@ QRect AnsweringArea(const QWidget& widget) {
   return widget.style()->subElementRect(area, &option, &widget);
 }
 
+/// What keys go to.
+QWidget& KeyboardOf(const ScreenWindow& window) {
+  QWidget* const focus = window.Window().focusWidget();
+  return focus != nullptr ? *focus : window.Window();
+}
+
 void ScrollIntoView(QWidget& widget) {
   for (QWidget* holder = widget.parentWidget(); holder != nullptr;
        holder = holder->parentWidget()) {
@@ -400,12 +406,18 @@ Outcome WindowHand::Press(Key key) {
                                                                 {Key::Up, Qt::Key_Up},
                                                                 {Key::Down, Qt::Key_Down},
                                                                 {Key::F1, Qt::Key_F1}}};
-  QWidget* const focus = front->Window().focusWidget();
-  QWidget& target = focus != nullptr ? *focus : front->Window();
   for (const auto& [known, code] : kKeys) {
-    if (known == key) PressKey(target, code);
+    if (known == key) Strike(*front, code);
   }
   return Taken();
+}
+
+/// A key comes up where the focus is by then. One that called up a box comes up in that.
+void WindowHand::Strike(const ScreenWindow& front, int code) {
+  const long boxes_before = boxes_.Shown();
+  KeyDown(KeyboardOf(front), code);
+  const ScreenWindow* const now = windows_.Front();
+  if (now != nullptr && boxes_.Shown() == boxes_before) KeyUp(KeyboardOf(*now), code);
 }
 
 /// While a menu is down, a letter of one of its entries is the menu's.
@@ -422,8 +434,7 @@ Outcome WindowHand::PressMnemonic(char letter) {
     }
   }
   CloseDropped();
-  QWidget* const focus = front->Window().focusWidget();
-  PressKey(focus != nullptr ? *focus : front->Window(), key, Qt::AltModifier);
+  PressKey(KeyboardOf(*front), key, Qt::AltModifier);
   return Taken();
 }
 

@@ -11,7 +11,7 @@ namespace marlowbeck {
 /// cannot be seen or is grey is refused, by the look of the widgets alone.
 class WindowHand {
  public:
-  explicit WindowHand(Windows& windows) : windows_(windows) {}
+  WindowHand(Windows& windows, const Boxes& boxes) : windows_(windows), boxes_(boxes) {}
 
   Outcome Perform(const Action& action);
 
@@ -35,6 +35,7 @@ class WindowHand {
   Outcome CellTwice(Control& control, int row, int col);
   Outcome PickDate(Control& control, Date date);
   Outcome Press(Key key);
+  void Strike(const ScreenWindow& front, int code);
   Outcome PressMnemonic(char letter);
   Outcome Focus(Control& control);
   Outcome Hover(Control& control);
@@ -51,6 +52,7 @@ class WindowHand {
   Outcome Taken();
 
   Windows& windows_;
+  const Boxes& boxes_;
 };
 
 }  // namespace marlowbeck

@@ -3,7 +3,6 @@
 #include <algorithm>
 
 #include "data/numbers.h"
-#include "data/runtime_error.h"
 #include "data/text.h"
 
 namespace marlowbeck {
@@ -112,6 +111,17 @@ void SideFileReader::PassSeparator() {
   if (AtEnd()) return;
   const bool windows_line_end = content_.compare(place_, 2, "\r\n") == 0;
   place_ += windows_line_end ? 2 : 1;
+}
+
+bool SideFileIsAtFault(const RunTimeError& error) {
+  switch (static_cast<ErrorNumber>(error.Number())) {
+    case ErrorNumber::FileNotFound:
+    case ErrorNumber::InputPastEnd:
+    case ErrorNumber::TypeMismatch:
+      return true;
+    default:
+      return false;
+  }
 }
 
 }  // namespace marlowbeck

@@ -4,6 +4,7 @@
 #include <string_view>
 
 #include "data/date.h"
+#include "data/runtime_error.h"
 
 namespace marlowbeck {
 
@@ -57,5 +58,9 @@ class SideFileReader {
   std::string content_;
   std::size_t place_ = 0;
 };
+
+/// What was read is itself at fault: the file is missing, is cut short or holds something of
+/// another type. A disk that fails for a moment is no reason to give up what is on it.
+[[nodiscard]] bool SideFileIsAtFault(const RunTimeError& error);
 
 }  // namespace marlowbeck

@@ -1,5 +1,7 @@
 #include "session/forfeits_choice.h"
 
+#include "data/side_file.h"
+
 namespace marlowbeck {
 namespace {
 
@@ -14,7 +16,8 @@ bool ReadForfeitsIncluded(const Context& context) {
     const double answer = context.channels.Reader(Channel::GameNames).Number();
     context.channels.Close(Channel::GameNames);
     return answer != 0;
-  } catch (const RunTimeError&) {
+  } catch (const RunTimeError& error) {
+    if (!SideFileIsAtFault(error)) throw;
     context.channels.AbandonAll();
     WriteForfeitsIncluded(context, true);
     return true;

@@ -4,6 +4,7 @@
 #include <vector>
 
 #include "data/competition.h"
+#include "data/side_file.h"
 #include "data/text.h"
 #include "session/messages.h"
 #include "ui/screens.h"
@@ -25,18 +26,6 @@ void ReadGameNames(const Context& context) {
   for (std::string& name : names) name = context.channels.Reader(Channel::GameNames).Text();
   context.channels.Close(Channel::GameNames);
   context.session.GameNames = names;
-}
-
-/// The file itself is at fault: it is missing, or does not hold six names. A disk that fails for a
-/// moment is no reason to give up the names that are on it.
-bool NamesAreMissing(const RunTimeError& error) {
-  switch (static_cast<ErrorNumber>(error.Number())) {
-    case ErrorNumber::FileNotFound:
-    case ErrorNumber::InputPastEnd:
-      return true;
-    default:
-      return false;
-  }
 }
 
 }  // namespace
@@ -61,7 +50,7 @@ void GameNames(const Context& context) {
   try {
     ReadGameNames(context);
   } catch (const RunTimeError& error) {
-    if (!NamesAreMissing(error)) throw;
+    if (!SideFileIsAtFault(error)) throw;
     context.channels.AbandonAll();
     WriteGameNames(context, {"Triples", "Doubles", "Singles", "Tpls", "Dbls", "Sgls"});
     ReadGameNames(context);

@@ -99,6 +99,15 @@ TEST(SideFile, NamesWithCommasAndQuotesComeBackAsTheyWere) {
   }
 }
 
+TEST(SideFile, IsAtFaultWhereItIsMissingCutShortOrOfAnotherTypeAlone) {
+  for (const int number : {53, 62, 13}) {
+    EXPECT_TRUE(SideFileIsAtFault(RunTimeError(number))) << number;
+  }
+  for (const int number : {52, 57, 61, 70, 71, 75, 76}) {
+    EXPECT_FALSE(SideFileIsAtFault(RunTimeError(number))) << number;
+  }
+}
+
 TEST(SideFile, AnyByteButALineEndOrAQuoteComesBack) {
   std::string bytes;
   for (int byte = 1; byte < 256; ++byte) {

@@ -36,7 +36,8 @@ struct frmPMenu : Screen {
   ComboBox cboResGrade{fraWeek, "cboResGrade", "Select Grade:"};
   ComboBox cboResTeam{fraWeek, "cboResTeam", "Select Team:"};
   ListBox lstAllDates{fraWeek, "lstAllDates", "Dates Played:"};
-  Command cmdChangeDate{fraWeek, "cmdChangeDate", "Change Game Date : "};
+  static constexpr const char* kChangeDate = "Change Game Date : ";
+  Command cmdChangeDate{fraWeek, "cmdChangeDate", kChangeDate};
   Command cmdPrintLad{fraWeek, "cmdPrintLad", "Print"};
   Command cmdClipWeek{fraWeek, "cmdClipWeek", "Copy to Clipboard"};
   Command cmdPlrResExit{fraWeek, "cmdPlrResExit", "Help"};
@@ -113,7 +114,9 @@ struct frmPMenu : Screen {
   void WireWeekly();
   [[nodiscard]] std::array<Picture*, 11> Entries();
   void TakeSelection();
+  void ShowSeason();
   void OfferNight(bool any);
+  void ForgetNight();
   void KeepForfeitsChoice(bool included);
   void OpenReport(int choice, std::string_view screen);
   /// Hides this screen and shows another, where there is such a screen.

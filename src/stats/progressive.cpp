@@ -7,7 +7,6 @@
 namespace marlowbeck {
 
 void frmPMenu::CalcProg() {
-  progressive_.clear();
   context_.GoToWorkingFolder();
   progressive_ = reports_.CalcProg(session_, context_.channels);
 }

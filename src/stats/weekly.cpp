@@ -18,10 +18,25 @@ constexpr const char* kTeamResults = "Team Results";
 void frmPMenu::DoWeekly() {
   fraWeek.SetCaption(kTeamResults);
   lblSeason1.SetCaption({});
+  // What an earlier visit listed is nothing to pick from where there is no grade any more.
+  cboResTeam.Clear();
+  lstAllDates.Clear();
+  OfferNight(false);
   GetGrades(context_, cboResGrade);
   // Without a grade there is no season to have a title.
   if (cboResGrade.Count() == 0) return;
-  cboResGrade.SetIndex(0);
+  try {
+    cboResGrade.SetIndex(0);
+  } catch (const RunTimeError&) {
+    // The season has its title whatever became of its latest night.
+    context_.channels.AbandonAll();
+    ShowSeason();
+    throw;
+  }
+  ShowSeason();
+}
+
+void frmPMenu::ShowSeason() {
   GetSeason();
   lblSeason1.SetCaption(session_.SeasonDescription);
 }
@@ -40,6 +55,8 @@ void frmPMenu::TakeSelection() {
 
 void frmPMenu::cboResGrade_Click() {
   TakeSelection();
+  // KEPT: the season's title stays that of the first grade when another one is picked; a repair
+  // would read the title of each grade here.
   GetTeams(context_, session_.Grade, cboResTeam);
   if (cboResTeam.Count() > 0) cboResTeam.SetIndex(0);
 }
@@ -79,6 +96,7 @@ void frmPMenu::OfferNight(bool any) {
 
 void frmPMenu::FillGrids() {
   if (fraWeek.Caption() != kTeamResults) return;
+  ForgetNight();
   ClearWeekGrids();
   if (lstAllDates.Count() == 0) {
     ListDates();
@@ -88,6 +106,15 @@ void frmPMenu::FillGrids() {
   GridWeekly();
   CalcProg();
   GridProg();
+}
+
+/// Until another night has been worked out nothing tells of the one before.
+void frmPMenu::ForgetNight() {
+  progressive_.clear();
+  lblOpp.SetCaption({});
+  lblDT.SetCaption({});
+  cmdChangeDate.SetCaption(kChangeDate);
+  lblProgInfo.SetCaption({});
 }
 
 void frmPMenu::ClearWeekGrids() {

@@ -100,6 +100,65 @@ TEST_F(ProgressiveReport, AnyNumberButZeroMeansYes) {
   EXPECT_EQ(File("Forfeits.qz3"), "-7");
 }
 
+TEST_F(ProgressiveReport, AnAnswerThatCannotBeReadForAMomentIsNotThrownAway) {
+  LayRovers();
+  WriteFile("Forfeits.qz3", "0\r\n");
+  OpenWeekly();
+  int failed = 0;
+  for (const char* kind : {"open", "read"}) {
+    // Each file of a pick in turn, the answer's own among them.
+    for (int nth = 1; nth <= 8; ++nth) {
+      Do("fault " + std::string(kind) + " " + std::to_string(nth) + " 57");
+      Do("pick lstAllDates 0");
+      failed += Count("error");
+      Do("fault off");
+      EXPECT_EQ(File("Forfeits.qz3"), "0\r\n") << kind << " " << nth;
+    }
+  }
+  EXPECT_GT(failed, 8);
+  Do("pick lstAllDates 1");
+  EXPECT_EQ(Count("error"), 0);
+  EXPECT_TRUE(Ticked("optFFno"));
+}
+
+TEST_F(ProgressiveReport, TheAnswerIsReadAgainAtEachPick) {
+  LayRovers();
+  OpenWeekly();
+  EXPECT_EQ(Row("grdProg", 1)[8], "2");
+  WriteFile("Forfeits.qz3", "0\r\n");
+  Do("pick lstAllDates 1");
+  EXPECT_TRUE(Ticked("optFFno"));
+  EXPECT_EQ(Row("grdProg", 1)[8], "1");
+  WriteFile("Forfeits.qz3", "1\r\n");
+  Do("pick lstAllDates 1");
+  EXPECT_TRUE(Ticked("optFFyes"));
+  EXPECT_EQ(Row("grdProg", 1)[8], "2");
+}
+
+TEST_F(ProgressiveReport, ADoubleClickOnYesWritesIt) {
+  LayRovers();
+  WriteFile("Forfeits.qz3", "-7");
+  OpenWeekly();
+  EXPECT_TRUE(Ticked("optFFyes"));
+  Do("click optFFyes");
+  EXPECT_EQ(File("Forfeits.qz3"), "-7") << "a click on the option that is selected is none";
+  Do("dblclick optFFyes");
+  EXPECT_TRUE(Ticked("optFFyes"));
+  EXPECT_EQ(File("Forfeits.qz3"), "1\r\n");
+}
+
+TEST_F(ProgressiveReport, AQuestionThatIsShownStaysWhereATableOfNobodyLeavesItAsItWas) {
+  Lay({Person(1, "Archer", "Jo", "Rovers", "A"), Person(2, "Baker", "Al", "Rovers", "A")},
+      {ForfeitNight(1, "Rovers", "Hawks", kFirstNight),
+       ForfeitNight(2, "Rovers", "Hawks", kFirstNight),
+       Night(1, "Rovers", "Swifts", kSecondNight, 505, 20)});
+  OpenWeekly();
+  EXPECT_TRUE(Shown("fraFFYesNo"));
+  Do("pick lstAllDates 0");
+  EXPECT_FALSE(Shown("grdProg"));
+  EXPECT_TRUE(Shown("fraFFYesNo"));
+}
+
 TEST_F(ProgressiveReport, APlayerWhoChangedTeamStandsUnderTheNewOneAlone) {
   Lay({Person(1, "Archer", "Jo", "Hawks", "A"), Person(2, "Baker", "Al", "Rovers", "A")},
       {Night(1, "Rovers", "Owls", kFirstNight, 500, 20),

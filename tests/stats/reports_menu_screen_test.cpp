@@ -10,9 +10,11 @@ class ReportsMenu : public ReportsTest {
     EXPECT_TRUE(Shown("fraMenu", here));
     for (const char* hidden : {"lblSeason", "lblNoneFound", "picPrint", "picPrintHI", "fraFontPick",
                                "lblFontInfo", "fraHi", "fraWkProg", "fraWeek", "fraPikHi",
-                               "cmdReDoAvgs", "FraCombineOptions", "imgBall", "fraFFYesNo"}) {
+                               "cmdReDoAvgs", "FraCombineOptions", "imgBall"}) {
       EXPECT_FALSE(Shown(hidden, here)) << hidden;
     }
+    // It lies in a panel that is hidden itself, so that only its own state tells.
+    EXPECT_EQ(Get("fraFFYesNo", here)["visible"], false);
   }
 };
 
@@ -138,13 +140,39 @@ TEST_F(ReportsMenu, AFontFileThatCannotBeReadIsWrittenAnew) {
   }
 }
 
+TEST_F(ReportsMenu, AQuestionThatStoodThereIsGoneFromTheMenuAndFromTheNextReport) {
+  LayRovers();
+  OpenWeekly();
+  EXPECT_TRUE(Shown("fraFFYesNo"));
+  Do("click cmdCancelWK");
+  ExpectMenu();
+}
+
 TEST_F(ReportsMenu, WithoutTheOpenFilesNameWhatWasOpenStays) {
   LayRovers();
+  WriteFile("FontName.qz3", "12,\"Sans\",#FALSE#,#FALSE#\r\n");
   Start();
   const Json open = InSession("PlayerFile");
-  Do("events");
+  // The name is written before the screen opens, then the font is read, and the name is last.
+  const auto opened = [this] { return Do("fault count")["operations"]["open"].get<int>(); };
+  const int before = opened();
   OpenReports();
+  const int last = opened() - before;
+  Do("click Image10");
+  Do("fault open " + std::to_string(last) + " 53");
+  OpenReports();
+  Do("fault off");
+  EXPECT_TRUE(Boxes().empty());
+  ExpectMenu();
   EXPECT_EQ(InSession("PlayerFile"), open);
+  Do("click Image6");
+  EXPECT_EQ(Text("cboResTeam"), "Rovers");
+}
+
+TEST_F(ReportsMenu, TheNameThatIsReadIsTheOneThatIsOpen) {
+  LayRovers();
+  OpenReports();
+  EXPECT_EQ(InSession("PlayerFile"), FilePath("Winter.qza").string());
 }
 
 }  // namespace

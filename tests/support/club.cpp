@@ -330,6 +330,11 @@ FaultPlan& Club::Faults() {
   return houses_.front()->driver->GetWorld().Faults();
 }
 
+Screens& Club::ScreensOf() {
+  Start();
+  return houses_.front()->driver->GetWorld().GetScreens();
+}
+
 void Club::ExpectEqualFolders(Here here) const {
   const House& first = *houses_.front();
   const auto names = NamesIn(first.folder.Path());

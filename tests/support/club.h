@@ -128,6 +128,8 @@ class Club {
 
   /// The disk's faults, of the face that answers.
   [[nodiscard]] FaultPlan& Faults();
+  /// The screens of the face that answers, for what no answer tells of them.
+  [[nodiscard]] Screens& ScreensOf();
 
   /// Expects the folders of all faces to hold the same files with the same bytes.
   void ExpectEqualFolders(Here here = Here::current()) const;

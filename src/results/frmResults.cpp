@@ -14,7 +14,9 @@ constexpr int kHelpTopic = 140;
 }  // namespace
 
 frmResults::frmResults(Screens& screens, const Context& context)
-    : Screen(screens, "frmResults", "[Marlowbeck]  Results Entry"), context_(context) {
+    : Screen(screens, "frmResults", "[Marlowbeck]  Results Entry"),
+      scores(fraResults, context),
+      context_(context) {
   cboResGrade.Click = [this] { cmdGotoResults.SetFocus(); };
   Cal.Change = [this] { Cal_Change(); };
   cmdGotoResults.Click = [this] { StartScores(); };
@@ -36,20 +38,18 @@ frmResults::frmResults(Screens& screens, const Context& context)
   cmdLast.Click = [this] { cmdLast_Click(); };
   cmdMakeWorkDate.Click = [this] { cmdMakeWorkDate_Click(); };
 
-  txtAgg.LostFocus = [this] { txtAgg_LostFocus(); };
-  txtShots.LostFocus = [this] { txtShots_LostFocus(); };
-  txtHowMany180s.LostFocus = [this] { CheckCenturies(); };
-  for (TextBox& peg : txtP) peg.LostFocus = [this, &peg] { CheckPeg(peg); };
+  scores.txtAgg.LostFocus = [this] { txtAgg_LostFocus(); };
+  scores.txtShots.LostFocus = [this] { scores.ShowAverage(); };
+  scores.txtHowMany180s.LostFocus = [this] { CheckCenturies(); };
+  for (TextBox& peg : scores.txtP) peg.LostFocus = [this, &peg] { CheckPeg(peg); };
   chkFF.Click = [this] { chkFF_Click(); };
   cmdSave.Click = [this] { cmdSave_Click(); };
   cmdClearRes.Click = [this] { cmdClearRes_Click(); };
   cmdResultsCancel.Click = [this] { RePick(); };
   EdCal.Change = [this] { EdCal_Change(); };
 
-  for (TextBox* shown_only : {&txtDayName, &txtAvg}) {
-    shown_only->SetLocked(true);
-    shown_only->SetTabStop(false);
-  }
+  txtDayName.SetLocked(true);
+  txtDayName.SetTabStop(false);
   fraResults.SetMeaning(Meaning::Black);
   Defaults = {&cmdSave, &cmdGotoResults};
   Cancels = {&cmdResultsCancel, &cmdExit};

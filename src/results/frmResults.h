@@ -7,7 +7,7 @@
 
 #include "data/records.h"
 #include "results/date_steps.h"
-#include "results/score_rules.h"
+#include "results/score_boxes.h"
 #include "ui/context.h"
 #include "ui/controls.h"
 #include "ui/screen.h"
@@ -59,20 +59,7 @@ struct frmResults : Screen {
   Panel panSurname{fraResults, "panSurname"};
   Label lblPlrID{fraResults, "lblPlrID", "Player ID"};
   Panel panPlrID{fraResults, "panPlrID"};
-  TextBox txtAgg{fraResults, "txtAgg", "Aggregate:"};
-  TextBox txtShots{fraResults, "txtShots", "Shots:"};
-  TextBox txtAvg{fraResults, "txtAvg", "Average:"};
-  TextBox txtHS{fraResults, "txtHS", "Highest Score:"};
-  TextBox txtCent{fraResults, "txtCent", "Total Centuries:"};
-  TextBox txtHowMany180s{fraResults, "txtHowMany180s", "Total 180's:"};
-  std::array<Label, 6> lblP = {Label{fraResults, "lblP1"}, Label{fraResults, "lblP2"},
-                               Label{fraResults, "lblP3"}, Label{fraResults, "lblP4"},
-                               Label{fraResults, "lblP5"}, Label{fraResults, "lblP6"}};
-  std::array<TextBox, 6> txtP = {TextBox{fraResults, "txtP1"}, TextBox{fraResults, "txtP2"},
-                                 TextBox{fraResults, "txtP3"}, TextBox{fraResults, "txtP4"},
-                                 TextBox{fraResults, "txtP5"}, TextBox{fraResults, "txtP6"}};
-  Label lblLegs{fraResults, "lblLegs", "Total Legs played:"};
-  TextBox txtLegs{fraResults, "txtLegs"};
+  ScoreBoxes scores;  // lies in fraResults
   Command cmdSave{fraResults, "cmdSave", "Save"};
   Command cmdClearRes{fraResults, "cmdClearRes", "Clear Scores"};
   Command cmdResultsCancel{fraResults, "cmdResultsCancel", "Cancel"};
@@ -146,7 +133,6 @@ struct frmResults : Screen {
 
   // Its rules.
   void txtAgg_LostFocus();
-  void txtShots_LostFocus();
   void CheckPeg(TextBox& peg);
   void PegHi(TextBox& peg);
   /// Leaves Flag at 1 when a rule is broken, at 0 when all is well, and as it stood when neither
@@ -168,16 +154,7 @@ struct frmResults : Screen {
   [[nodiscard]] bool FindPlayer(const ListBox& list);
   void ShowPlayer(const PlayerRecord& player);
   [[nodiscard]] int FindSavedResult();
-  void FillSheet();
-  void FillScores();
   void ShowForCorrection();
-  [[nodiscard]] std::array<TextBox*, 13> ScoreBoxes();
-  void BlankScores();
-  void ShowAverage();
-  /// Warns, then blanks one box and puts the focus into one, where there is one to be.
-  void Refuse(std::string_view text, TextBox* blanked, TextBox* focus);
-  void TellCenturies(CenturiesCheck found);
-  void AskFor180();
   [[nodiscard]] bool ScoresPass();
   void RestoreWhenEditing();
   [[nodiscard]] bool DateIsTaken();

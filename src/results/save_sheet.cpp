@@ -7,14 +7,6 @@
 #include "session/messages.h"
 
 namespace marlowbeck {
-namespace {
-
-std::int16_t Figure(const TextBox& box) {
-  return static_cast<std::int16_t>(int{Integer::Narrow(Val(box.Text()))});
-}
-
-}  // namespace
-
 void frmResults::cmdSave_Click() {
   Session& session = context_.session;
   if (!chkFF.Value() && !ScoresPass()) return;
@@ -23,11 +15,9 @@ void frmResults::cmdSave_Click() {
     return KeepOldDate();
   }
   FillRecord();
-  if (Val(txtAgg.Text()) >= 1 && Val(txtLegs.Text()) < 1) {
-    // KEPT: a save refused for its legs leaves the results file open until it is opened again; a
-    // repair would close it here.
-    return Refuse("You must enter Legs before saving !", &txtLegs, &txtLegs);
-  }
+  // KEPT: a save refused for its legs leaves the results file open until it is opened again; a
+  // repair would close it here.
+  if (!scores.HasLegs()) return;
   WriteRecord();
   EdCal.SetValue(session.WorkDate);
   context_.channels.CloseAll();
@@ -38,14 +28,10 @@ void frmResults::cmdSave_Click() {
 }
 
 bool frmResults::ScoresPass() {
-  if (Val(txtAgg.Text()) < 1 || Val(txtShots.Text()) < 1) {
-    Refuse("Must have AGGREGATE and SHOTS before saving !", nullptr, &txtAgg);
-    return false;
-  }
-  if (Val(txtAvg.Text()) > kHighestAverage) {
-    Warning(context_, "Some entries seem too high !");
+  if (!scores.HasAggregateAndShots()) return false;
+  if (!scores.AverageIsPossible()) {
     RestoreWhenEditing();
-    txtAgg.SetFocus();
+    scores.txtAgg.SetFocus();
     return false;
   }
   CheckCenturies();
@@ -82,13 +68,7 @@ void frmResults::FillRecord() {
   record_.Opposition = cboOpp.Text();
   record_.GameDate = context_.session.EditRecord > 0 ? EdCal.Value() : context_.session.WorkDate;
   record_.Forfeit.assign(chkFF.Value() ? 1 : 0, 'F');
-  record_.Legs = Figure(txtLegs);
-  record_.Aggregate = Figure(txtAgg);
-  record_.Shots = NarrowToLong(Val(txtShots.Text()));
-  record_.HighScore = Figure(txtHS);
-  record_.Centuries = Figure(txtCent);
-  record_.Scores180 = Figure(txtHowMany180s);
-  for (std::size_t i = 0; i < txtP.size(); ++i) record_.Pegs[i] = Figure(txtP[i]);
+  scores.MoveInto(record_);
 }
 
 void frmResults::WriteRecord() {

@@ -10,14 +10,6 @@
 #include "session/messages.h"
 
 namespace marlowbeck {
-namespace {
-
-void FillAboveZero(TextBox& box, int value) {
-  if (value > 0) box.SetText(NumberText(value));
-}
-
-}  // namespace
-
 void frmResults::lstResPlayers_Click() {
   if (lstFinished.Count() >= kPlayersOfATeam) {
     const int answer =
@@ -48,8 +40,8 @@ void frmResults::GotPlayer() {
   }
   WhichBoxes();
   // The three games of a grade without any best of three are one leg each.
-  if (session.BestOfThree == 111) txtLegs.SetText("3");
-  if (!panPlrID.Caption().empty()) txtAgg.SetFocus();
+  if (session.BestOfThree == 111) scores.txtLegs.SetText("3");
+  if (!panPlrID.Caption().empty()) scores.txtAgg.SetFocus();
 }
 
 /// Shows the sheet of the first player whose name is the selected line; false when there is none.
@@ -81,13 +73,13 @@ void frmResults::lstFinished_Click() {
   Session& session = context_.session;
   EnableBoxes();
   ClearResults();
-  if (FindPlayer(lstFinished)) txtAgg.SetFocus();
+  if (FindPlayer(lstFinished)) scores.txtAgg.SetFocus();
   session.EditRecord = 0;
   const int number = FindSavedResult();
   if (number == 0) return;
   session.EditRecord = number;
   WhichBoxes();
-  FillSheet();
+  scores.Fill(record_);
   ShowForCorrection();
 }
 
@@ -111,23 +103,6 @@ int frmResults::FindSavedResult() {
   return found;
 }
 
-void frmResults::FillSheet() {
-  txtAgg.SetText(NumberText(record_.Aggregate));
-  txtShots.SetText(NumberText(record_.Shots));
-  ShowAverage();
-  FillScores();
-  FillAboveZero(txtLegs, record_.Legs);
-}
-
-/// Those that are filled only where there is something. Old pegs go into hidden boxes too, so that
-/// they are still there after the next save.
-void frmResults::FillScores() {
-  FillAboveZero(txtHS, record_.HighScore);
-  FillAboveZero(txtCent, record_.Centuries);
-  FillAboveZero(txtHowMany180s, record_.Scores180);
-  for (std::size_t i = 0; i < txtP.size(); ++i) FillAboveZero(txtP[i], record_.Pegs[i]);
-}
-
 void frmResults::ShowForCorrection() {
   fraResults.SetCaption("EDIT Player's Score");
   fraResults.SetMeaning(Meaning::Red);
@@ -146,14 +121,7 @@ void frmResults::GetOldScores() {
   OpenResultSFile(context_.session, context_.channels);
   ReadRecord(context_.session.EditRecord);
   context_.channels.CloseAll();
-  txtAgg.SetText(NumberText(record_.Aggregate));
-  txtShots.SetText(NumberText(record_.Shots));
-  // KEPT: a restored average stands as a plain number, 47.5 for 47.50; a repair would give it two
-  // places.
-  const bool has_average = record_.Aggregate > 0 && record_.Shots > 0;
-  txtAvg.SetText(has_average ? NumberText(SheetAverage(record_.Aggregate, record_.Shots)) : "");
-  // KEPT: the legs are not restored with the other figures; a repair would fill txtLegs too.
-  FillScores();
+  scores.Restore(record_);
 }
 
 void frmResults::GetNoP() {
@@ -171,12 +139,7 @@ void frmResults::GetNoP() {
 
 void frmResults::WhichBoxes() {
   GetNoP();
-  const PegBoxes boxes = PegBoxesFor(context_.session.BestOfThree, context_.session.GameNames);
-  for (std::size_t i = 0; i < txtP.size(); ++i) {
-    lblP[i].SetCaption(boxes.captions[i]);
-    lblP[i].SetVisible(boxes.shown[i]);
-    txtP[i].SetVisible(boxes.shown[i]);
-  }
+  scores.ShowPegBoxes(context_.session.BestOfThree, context_.session.GameNames);
 }
 
 void frmResults::ClearResults() {
@@ -186,41 +149,30 @@ void frmResults::ClearResults() {
   for (Panel* panel : {&panSurname, &panFirstName, &panPlrID}) panel->SetCaption("");
 }
 
-std::array<TextBox*, 13> frmResults::ScoreBoxes() {
-  return {&txtAgg,  &txtShots, &txtAvg,  &txtHS,   &txtCent, &txtHowMany180s, &txtP[0],
-          &txtP[1], &txtP[2],  &txtP[3], &txtP[4], &txtP[5], &txtLegs};
-}
-
 void frmResults::EnableBoxes() {
-  for (TextBox* box : ScoreBoxes()) box->Enable();
+  scores.Enable();
   chkFF.SetValue(false);
 }
 
-void frmResults::DisableBoxes() {
-  for (TextBox* box : ScoreBoxes()) box->Disable();
-}
-
-void frmResults::BlankScores() {
-  for (TextBox* box : ScoreBoxes()) box->SetText("");
-}
+void frmResults::DisableBoxes() { scores.Disable(); }
 
 void frmResults::chkFF_Click() {
   if (!chkFF.Value()) {
-    for (TextBox* box : ScoreBoxes()) box->Enable();
+    scores.Enable();
     return;
   }
-  BlankScores();
+  scores.Blank();
   DisableBoxes();
 }
 
 void frmResults::cmdClearRes_Click() {
   EnableBoxes();
-  BlankScores();
-  txtAgg.SetFocus();
+  scores.Blank();
+  scores.txtAgg.SetFocus();
 }
 
 void frmResults::EdCal_Change() {
-  txtAgg.SetFocus();
+  scores.txtAgg.SetFocus();
   Heading();
 }
 

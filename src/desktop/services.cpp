@@ -6,27 +6,31 @@
 #include <QClipboard>
 #include <QDate>
 #include <QDir>
-#include <QEventLoop>
 #include <QFileInfo>
+#include <QLibrary>
 #include <QScreen>
-#include <QTimer>
-#ifdef MARLOWBECK_MULTIMEDIA
-#include <QAudioDevice>
-#include <QMediaDevices>
-#include <QSoundEffect>
-#endif
 
 #include "data/text.h"
 #include "desktop/encoding.h"
+#include "desktop/sound/wave_player.h"
 #include "desktop/working_folder.h"
 
 namespace marlowbeck {
 namespace {
 
 constexpr int kTwipsPerPixel = 15;
-#ifdef MARLOWBECK_MULTIMEDIA
-constexpr int kLongestSound = 1000;  ///< milliseconds
+
+using PlayWave = decltype(&MarlowbeckPlayWave);
+
+/// Answers null where the program was built without sound, or is handed out without it.
+PlayWave FindPlayer() {
+#ifdef MARLOWBECK_SOUND_LINKED
+  return &MarlowbeckPlayWave;
+#else
+  const QString library = QApplication::applicationDirPath() + "/marlowbeck-sound";
+  return reinterpret_cast<PlayWave>(QLibrary::resolve(library, "MarlowbeckPlayWave"));
 #endif
+}
 
 }  // namespace
 
@@ -36,8 +40,6 @@ void DesktopClipboard::Clear() { QApplication::clipboard()->clear(); }
 void DesktopClipboard::SetText(const std::string& text) {
   QApplication::clipboard()->setText(QString::fromStdString(Utf8FromCp1252(text)));
 }
-
-DesktopSound::~DesktopSound() = default;
 
 void DesktopSound::Beep() { QApplication::beep(); }
 
@@ -50,42 +52,13 @@ QString DesktopSound::WavePath() const {
   return QFileInfo::exists(path) ? path : QString();
 }
 
-#ifdef MARLOWBECK_MULTIMEDIA
-namespace {
-
-/// Plays a sound and waits for its end, but never for long.
-void PlayToTheEnd(QSoundEffect& effect) {
-  QEventLoop loop;
-  const auto leave = [&] {
-    if (!effect.isPlaying() || effect.status() == QSoundEffect::Error) loop.quit();
-  };
-  QObject::connect(&effect, &QSoundEffect::playingChanged, &loop, leave);
-  QObject::connect(&effect, &QSoundEffect::statusChanged, &loop, leave);
-  QTimer::singleShot(kLongestSound, &loop, &QEventLoop::quit);
-  effect.play();
-  if (effect.isPlaying()) loop.exec(QEventLoop::ExcludeUserInputEvents);
-}
-
-}  // namespace
-
 /// A machine without a voice must not hold up a save.
 void DesktopSound::Play() {
   const QString path = WavePath();
   if (mute_ || path.isEmpty()) return;
-  if (player_ == nullptr) {
-    mute_ = QMediaDevices::defaultAudioOutput().isNull();
-    if (mute_) return;
-    auto effect = std::make_unique<QSoundEffect>();
-    effect->setSource(QUrl::fromLocalFile(path));
-    player_ = std::move(effect);
-  }
-  auto& effect = static_cast<QSoundEffect&>(*player_);
-  PlayToTheEnd(effect);
-  mute_ = effect.status() == QSoundEffect::Error;
+  static const PlayWave play = FindPlayer();
+  mute_ = play == nullptr || !play(path);
 }
-#else
-void DesktopSound::Play() {}
-#endif
 
 Date DesktopClock::Today() { return FromQt(QDate::currentDate()); }
 

@@ -1,14 +1,11 @@
 #pragma once
 
 #include <functional>
-#include <memory>
 #include <string>
 
 #include <QStringList>
 
 #include "platform/platform.h"
-
-class QObject;
 
 namespace marlowbeck {
 
@@ -20,13 +17,11 @@ class DesktopClipboard : public Clipboard {
   void SetText(const std::string& text) override;
 };
 
-/// The confirming sound, where the machine can play one. What makes the sound is only set up when
-/// the first is wanted, which keeps the start short.
+/// The confirming sound, where the machine can play one.
 class DesktopSound : public Sound {
  public:
   /// The wave file lies in one of these folders; the first that has it counts.
   explicit DesktopSound(QStringList folders) : folders_(std::move(folders)) {}
-  ~DesktopSound() override;
   void Beep() override;
   void Prepare(const std::string& wave_file) override;
   void Play() override;
@@ -39,7 +34,6 @@ class DesktopSound : public Sound {
  private:
   QStringList folders_;
   std::string wave_file_;
-  std::unique_ptr<QObject> player_;
   bool mute_ = false;  ///< found out at the first sound: no other is tried
 };
 

@@ -32,6 +32,15 @@ void TakeNoRoomForBlanks(QLabel& label) {
 
 }  // namespace
 
+/// A press that begins a click is not passed on to what the panel lies in.
+bool PanelView::Pressed(const QWidget& /*on*/, const QMouseEvent& /*event*/) {
+  return static_cast<bool>(GetControl().Click);
+}
+
+bool PanelView::ClicksAt(const QWidget& /*on*/, QPoint /*at*/) const {
+  return static_cast<bool>(GetControl().Click);
+}
+
 void PanelView::ShowKind() {
   const std::string& caption = GetControl().Caption();
   if (auto* const group = qobject_cast<QGroupBox*>(Widget())) {
@@ -71,6 +80,14 @@ LabelView::LabelView(Control& control, QLabel* label, Windows& windows)
   if (control.Click) label_.setCursor(Qt::PointingHandCursor);
 }
 
+bool LabelView::Pressed(const QWidget& /*on*/, const QMouseEvent& /*event*/) {
+  return static_cast<bool>(GetControl().Click);
+}
+
+bool LabelView::ClicksAt(const QWidget& /*on*/, QPoint /*at*/) const {
+  return static_cast<bool>(GetControl().Click);
+}
+
 void LabelView::ShowKind() {
   label_.setText(ToQt(GetControl().Caption()));
   label_.setAccessibleName(Spoken(GetControl().Caption()));
@@ -106,6 +123,10 @@ void ButtonView::ReadKind(ControlState& state) const {
 MenuView::MenuView(Control& control, QAction* action, Windows& windows)
     : View(control, nullptr, windows), action_(*action) {
   connect(action, &QAction::triggered, this,
+          [this] { Do([this](Hand& hand) { return hand.Click(GetControl()); }); });
+  if (action->menu() == nullptr) return;
+  // Its screen comes to the front, however it was dropped down.
+  connect(action->menu(), &QMenu::aboutToShow, this,
           [this] { Do([this](Hand& hand) { return hand.Click(GetControl()); }); });
 }
 

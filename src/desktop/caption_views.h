@@ -17,6 +17,8 @@ namespace marlowbeck {
 class PanelView : public CaptionedView {
  public:
   using CaptionedView::CaptionedView;
+  bool Pressed(const QWidget& on, const QMouseEvent& event) override;
+  [[nodiscard]] bool ClicksAt(const QWidget& on, QPoint at) const override;
 
  protected:
   void ShowKind() override;
@@ -27,6 +29,8 @@ class PanelView : public CaptionedView {
 class LabelView : public View {
  public:
   LabelView(Control& control, QLabel* label, Windows& windows);
+  bool Pressed(const QWidget& on, const QMouseEvent& event) override;
+  [[nodiscard]] bool ClicksAt(const QWidget& on, QPoint at) const override;
 
  protected:
   void ShowKind() override;

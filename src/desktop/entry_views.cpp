@@ -29,6 +29,10 @@ TextView::TextView(TextBox& control, QLineEdit* box, Windows& windows)
   });
 }
 
+bool TextView::ClicksAt(const QWidget& /*on*/, QPoint /*at*/) const {
+  return static_cast<bool>(model_.Click);
+}
+
 void TextView::ShowKind() {
   box_.setReadOnly(model_.Locked());
   if (FromQt(box_.text()) != model_.Text()) box_.setText(ToQt(model_.Text()));
@@ -109,6 +113,11 @@ DateView::DateView(DatePicker& control, QDateEdit* box, Windows& windows)
   connect(box, &QDateEdit::userDateChanged, this, [this](QDate date) {
     Do([=, this](Hand& hand) { return hand.PickDate(model_, FromQt(date)); });
   });
+}
+
+/// Not where the calendar drops down.
+bool DateView::ClicksAt(const QWidget& on, QPoint /*at*/) const {
+  return model_.Click && &on != &box_;
 }
 
 void DateView::ShowKind() {

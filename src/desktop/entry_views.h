@@ -12,6 +12,7 @@ namespace marlowbeck {
 class TextView : public CaptionedView {
  public:
   TextView(TextBox& control, QLineEdit* box, Windows& windows);
+  [[nodiscard]] bool ClicksAt(const QWidget& on, QPoint at) const override;
   void FocusCame() override { box_.selectAll(); }
 
  protected:
@@ -43,6 +44,7 @@ class ComboView : public CaptionedView {
 class DateView : public CaptionedView {
  public:
   DateView(DatePicker& control, QDateEdit* box, Windows& windows);
+  [[nodiscard]] bool ClicksAt(const QWidget& on, QPoint at) const override;
   void FinishTyping() override { box_.interpretText(); }
 
  protected:

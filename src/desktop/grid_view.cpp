@@ -197,6 +197,7 @@ void GridView::ReadKind(ControlState& state) const {
 }
 
 bool GridView::Pressed(const QWidget& on, const QMouseEvent& event) {
+  if (&on == &table_) return true;  // the edge
   const QPoint place = event.position().toPoint();
   if (&on == table_.viewport()) {
     const QModelIndex index = table_.indexAt(place);
@@ -208,6 +209,11 @@ bool GridView::Pressed(const QWidget& on, const QMouseEvent& event) {
   const int col = header.logicalIndexAt(place);
   if (col >= 0) PressCell(0, col);
   return true;
+}
+
+/// A click beside the cells is one on the grid; the current cell stays.
+bool GridView::ClicksAt(const QWidget& on, QPoint at) const {
+  return &on == &table_ || (&on == table_.viewport() && !table_.indexAt(at).isValid());
 }
 
 void GridView::PressCell(int row, int col) {

@@ -14,6 +14,7 @@ class GridView : public CaptionedView {
  public:
   GridView(Grid& control, QTableWidget* table, Windows& windows);
   bool Pressed(const QWidget& on, const QMouseEvent& event) override;
+  [[nodiscard]] bool ClicksAt(const QWidget& on, QPoint at) const override;
   bool Typed(const QKeyEvent& event) override;
   [[nodiscard]] bool KeepsArrows() const override { return true; }
 

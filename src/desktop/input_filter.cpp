@@ -1,5 +1,7 @@
 #include "desktop/input_filter.h"
 
+#include <utility>
+
 #include <QAbstractScrollArea>
 #include <QApplication>
 #include <QComboBox>
@@ -20,11 +22,6 @@ char AltLetter(const QKeyEvent& event) {
   const bool letter =
       (key >= Qt::Key_A && key <= Qt::Key_Z) || (key >= Qt::Key_0 && key <= Qt::Key_9);
   return letter ? static_cast<char>(key) : '\0';
-}
-
-/// Labels and panels that answer to a click of their own.
-bool IsClickable(const Control& control) {
-  return (control.GetKind() == Kind::Label || control.GetKind() == Kind::Panel) && control.Click;
 }
 
 /// Lets the menu of a menu bar drop down, as its letter does.
@@ -192,7 +189,7 @@ bool InputFilter::MousePress(QObject& watched, ScreenWindow& window, const QMous
   if (event.button() != Qt::LeftButton) return false;
   pressed_ = &control;
   const auto* const widget = static_cast<const QWidget*>(&watched);
-  return view->Pressed(*widget, event) || IsClickable(control);
+  return view->Pressed(*widget, event);
 }
 
 bool InputFilter::SecondPress(QObject& watched, ScreenWindow& window, const QMouseEvent& event) {
@@ -215,11 +212,14 @@ bool InputFilter::MouseRelease(const QObject& watched, ScreenWindow& window,
   View* const view = window.ViewAt(&watched);
   if (view == nullptr || event.button() != Qt::LeftButton) return false;
   Control& control = view->GetControl();
-  const bool inside = view->Widget()->rect().contains(event.position().toPoint());
-  if (!IsClickable(control) || pressed_ != &control || !inside) return false;
-  pressed_ = nullptr;
-  windows_.Do(view, [&](Hand& hand) { return hand.Click(control); });
-  return true;
+  if (std::exchange(pressed_, nullptr) != &control) return false;
+  const auto& on = static_cast<const QWidget&>(watched);
+  const QPoint at = event.position().toPoint();
+  const bool inside = view->Widget()->rect().contains(on.mapTo(view->Widget(), at));
+  if (inside && view->ClicksAt(on, at)) {
+    windows_.Do(view, [&](Hand& hand) { return hand.Click(control); });
+  }
+  return false;
 }
 
 bool InputFilter::MouseMove(const QObject& watched, ScreenWindow& window,

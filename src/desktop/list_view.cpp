@@ -93,6 +93,7 @@ void ListView::ReadKind(ControlState& state) const {
 
 /// A press beside the lines only brings the focus.
 bool ListView::Pressed(const QWidget& on, const QMouseEvent& event) {
+  if (&on == &list_) return true;  // the edge
   if (&on != list_.viewport()) return false;
   const QModelIndex index = list_.indexAt(event.position().toPoint());
   if (index.isValid()) PressLine(index.row(), event.modifiers());

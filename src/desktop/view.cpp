@@ -64,6 +64,7 @@ void View::ReadCommon(ControlState& state) const {
 }
 
 bool View::Pressed(const QWidget& /*on*/, const QMouseEvent& /*event*/) { return false; }
+bool View::ClicksAt(const QWidget& /*on*/, QPoint /*at*/) const { return false; }
 bool View::Typed(const QKeyEvent& /*event*/) { return false; }
 
 Outcome View::Do(const Act& act) { return windows_.Do(this, act); }

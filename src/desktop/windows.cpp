@@ -49,6 +49,7 @@ Outcome Windows::Guarded(const Act& act) {
   } catch (...) {
     if (!keeps_failures_) throw;
     failure_ = std::current_exception();
+    screens_.Settle();
     return {"the event was broken off", true};
   }
 }

@@ -31,7 +31,7 @@ ActionReader ControlAlone(Verb verb) {
 
 Action ReadType(World& world, Arguments& arguments) {
   Action action = On(Verb::Type, TakeControl(arguments, world.GetScreens()));
-  action.text = arguments.Rest();
+  action.text = arguments.Typed();
   return action;
 }
 

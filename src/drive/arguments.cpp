@@ -16,6 +16,13 @@ std::string_view WithoutLeadingBlanks(std::string_view text) {
   return first == std::string_view::npos ? std::string_view() : text.substr(first);
 }
 
+/// No control character, and none of the places of the code page that are empty.
+bool IsWritten(char letter) {
+  constexpr std::string_view kEmptyPlaces = "\x7F\x81\x8D\x8F\x90\x9D";
+  return static_cast<unsigned char>(letter) >= ' ' &&
+         kEmptyPlaces.find(letter) == std::string_view::npos;
+}
+
 }  // namespace
 
 std::optional<std::string> ReadScriptLine(std::string_view line) {
@@ -66,6 +73,16 @@ Date Arguments::Day(std::string_view what) {
 std::string Arguments::Rest() {
   if (rest_.starts_with(' ')) rest_.remove_prefix(1);
   return std::string(std::exchange(rest_, {}));
+}
+
+std::string Arguments::Typed() {
+  std::string text = Rest();
+  for (const char letter : text) {
+    if (IsWritten(letter)) continue;
+    Refuse("there is no key that writes character " +
+           std::to_string(static_cast<unsigned char>(letter)) + " into a box");
+  }
+  return text;
 }
 
 void Arguments::Finish() const {

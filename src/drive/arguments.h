@@ -31,6 +31,8 @@ class Arguments {
   Date Day(std::string_view what);
   /// All that follows the one blank after the last word, blanks included; may be empty.
   std::string Rest();
+  /// The same as what is typed into a box. Refuses what no key writes there.
+  std::string Typed();
   /// Refuses when anything is left.
   void Finish() const;
 

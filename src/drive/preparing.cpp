@@ -20,7 +20,7 @@ void PrepareMessage(World& world, Arguments& arguments, Json& /*answer*/) {
 }
 
 void PrepareInput(World& world, Arguments& arguments, Json& /*answer*/) {
-  world.answers.inputs.Add(arguments.Rest());
+  world.answers.inputs.Add(arguments.Typed());
 }
 
 void PrepareFile(World& world, Arguments& arguments, Json& /*answer*/) {

@@ -35,6 +35,13 @@ bool CanBeClicked(const Control& control) {
   }
 }
 
+bool HasEntries(const Control& menu) {
+  const auto& controls = menu.InScreen().Controls();
+  return menu.GetKind() == Kind::Menu &&
+         std::any_of(controls.begin(), controls.end(),
+                     [&](const Control* entry) { return entry->InControl() == &menu; });
+}
+
 bool CanBeTypedInto(Control& control) {
   if (const auto* box = As<TextBox>(control)) return !box->Locked();
   if (const auto* combo = As<ComboBox>(control)) return !combo->Locked();
@@ -67,7 +74,6 @@ Outcome Hand::Whole(const Handler& action) {
 /// acted on; otherwise the action is lost.
 Outcome Hand::Act(Control& control, const Handler& action) {
   bool lost = true;
-  open_menu_ = nullptr;
   Whole([&] {
     screens_.BringToFront(control.InScreen());
     lost = !TakeFocus(control);
@@ -86,7 +92,15 @@ bool Hand::TakeFocus(Control& control) {
 Outcome Hand::Click(Control& control) {
   if (const Outcome check = CheckLive(control); !check.Done()) return check;
   if (!CanBeClicked(control)) return Refused(control, "has no click");
+  if (HasEntries(control)) return DropDown(control);
   return Act(control, [&] { ClickWithFocus(control); });
+}
+
+/// A menu that has entries drops down, and stays down until something else is done.
+Outcome Hand::DropDown(Control& menu) {
+  Outcome outcome = Act(menu, [] {});
+  open_menu_ = &menu;
+  return outcome;
 }
 
 void Hand::ClickWithFocus(Control& control) {
@@ -254,7 +268,6 @@ Outcome Hand::Focus(Control& control) {
 
 Outcome Hand::Hover(Control& control) {
   if (const Outcome check = CheckLive(control); !check.Done()) return check;
-  if (!control.MouseMove) return {};
   return Whole([&] { control.Fire(control.MouseMove); });
 }
 
@@ -371,15 +384,11 @@ Outcome Hand::PressMnemonic(char letter) {
   Screen* const front = screens_.Front();
   if (front == nullptr) return {"no screen is in front", false};
   Control* const control = WithMnemonic(*front, UpperCase(std::string(1, letter)).front());
+  CloseMenu();
   if (control == nullptr) {
     return {front->Name() + " has no live mnemonic " + std::string(1, letter), false};
   }
-  const bool is_menu =
-      control->GetKind() == Kind::Menu &&
-      std::any_of(front->Controls().begin(), front->Controls().end(),
-                  [&](const Control* entry) { return entry->InControl() == control; });
-  open_menu_ = is_menu ? control : nullptr;
-  return is_menu ? Outcome{} : Click(*control);
+  return Click(*control);
 }
 
 Control* Hand::WithMnemonic(const Screen& front, char letter) const {

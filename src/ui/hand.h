@@ -59,7 +59,7 @@ class Hand {
   Outcome Strike(Key key);
   /// The mnemonic of a letter: the command with it, or a menu, and then an entry of that menu.
   Outcome PressMnemonic(char letter);
-  /// The menu that a mnemonic dropped down has gone again.
+  /// The menu that was dropped down has gone again.
   void CloseMenu() { open_menu_ = nullptr; }
   Outcome Focus(Control& control);
   Outcome Hover(Control& control);
@@ -69,6 +69,7 @@ class Hand {
  private:
   Outcome Act(Control& control, const Handler& action);
   Outcome Whole(const Handler& action);
+  Outcome DropDown(Control& menu);
   Outcome Twice(Control& control, const std::function<Outcome()>& click);
   bool TakeFocus(Control& control);
   void ClickWithFocus(Control& control);

@@ -101,6 +101,7 @@ Screen* Screens::Front() const {
 }
 
 void Screens::BringToFront(Screen& screen) {
+  if (&screen == Front()) return;
   const auto place = std::find_if(loaded_.begin(), loaded_.end(),
                                   [&](const auto& loaded) { return loaded.get() == &screen; });
   if (place != loaded_.end()) std::rotate(place, place + 1, loaded_.end());

@@ -29,6 +29,36 @@ TEST_F(Acting, ClickReachesEveryKindThatHasOne) {
   }
 }
 
+TEST_F(Acting, ClickOnAnEntryOrAGridBesideItsCellsIsToldToo) {
+  for (const char* name : {"txtName", "txtLocked", "dtpDay", "grdTable"}) {
+    EXPECT_EQ(ToldBy(std::string("click ") + name), std::string(name) + " clicked;");
+    EXPECT_EQ(Focus(), std::string("frmBench.") + name);
+    EXPECT_EQ(ToldBy(std::string("dblclick ") + name),
+              std::string(name) + " clicked;" + name + " doubly;");
+  }
+}
+
+TEST_F(Acting, ClickBesideTheLinesOnlyBringsTheFocus) {
+  for (const char* name :
+       {"lstOne", "lstMany", "cboLocked", "cboFree", "drvDrives", "dirFolders", "filFiles"}) {
+    EXPECT_EQ(ToldBy(std::string("click ") + name), "");
+    EXPECT_EQ(Focus(), std::string("frmBench.") + name);
+    EXPECT_EQ(Index(name), -1);
+  }
+}
+
+TEST_F(Acting, ClickBesideTheLinesFindsAPlaceInAListThatIsFull) {
+  Change([](Workbench& bench) {
+    for (int i = 0; i < 50; ++i) bench.lstOne.AddLine("line " + std::to_string(i));
+    bench.grdTable.SetSize(60, 12);
+  });
+  EXPECT_EQ(ToldBy("click lstOne"), "");
+  EXPECT_EQ(Focus(), "frmBench.lstOne");
+  EXPECT_EQ(ToldBy("focus grdTable"), "");
+  EXPECT_EQ(Focus(), "frmBench.grdTable");
+  EXPECT_EQ(ToldBy("click grdTable"), "grdTable clicked;");
+}
+
 TEST_F(Acting, ClickTicksABoxAndChoosesAnOption) {
   EXPECT_EQ(ToldBy("click chkTick"), "chkTick clicked;");
   EXPECT_TRUE(Ticked("chkTick"));
@@ -88,6 +118,19 @@ TEST_F(Acting, TypeTakesLettersOfTheProgramsPage) {
   EXPECT_EQ(ToldBy("click cmdDo"), "seen;");
 }
 
+TEST_F(Acting, TypeIsRefusedForWhatNoKeyWrites) {
+  Do("type txtName old");
+  EXPECT_EQ(Refused("type txtName A\tB"),
+            "type txtName: there is no key that writes character 9 into a box");
+  EXPECT_EQ(Refused("type txtName A\rB"),
+            "type txtName: there is no key that writes character 13 into a box");
+  Refused("type txtName \x7F");
+  Refused("type txtName \xC2\x81");  // a character of no page
+  EXPECT_EQ(Text("txtName"), "old");
+  Do("type txtName a\xC2\xA0\xC2\xAD\xE2\x82\xAC");  // hard blank, soft hyphen, euro
+  EXPECT_EQ(Text("txtName"), "a\xC2\xA0\xC2\xAD\xE2\x82\xAC");
+}
+
 TEST_F(Acting, TypeIsRefusedOnWhatIsLocked) {
   EXPECT_EQ(Refused("type txtLocked x"), "txtLocked cannot be typed into");
   EXPECT_EQ(Refused("type cboLocked x"), "cboLocked cannot be typed into");
@@ -121,6 +164,31 @@ TEST_F(Acting, PickByTextTakesTheFirstEqualLineBlanksIncluded) {
   EXPECT_EQ(Index("lstOne"), 4);
   EXPECT_EQ(Refused("pick lstOne =a  b"), "lstOne has no line \"a  b\"");
   EXPECT_EQ(Refused("pick lstOne =First"), "lstOne has no line \"First\"");
+}
+
+TEST_F(Acting, PickReachesEveryLineOfALongList) {
+  Change([](Workbench& bench) {
+    for (int i = 3; i < 60; ++i) {
+      for (LineHolder* list :
+           std::initializer_list<LineHolder*>{&bench.lstOne, &bench.cboLocked, &bench.cboFree}) {
+        list->AddLine("line " + std::to_string(i));
+      }
+    }
+  });
+  for (const char* list : {"lstOne", "cboLocked", "cboFree"}) {
+    for (const int line : {59, 0, 30, 30, 31, 1}) {
+      EXPECT_EQ(ToldBy(std::string("pick ") + list + " " + std::to_string(line)),
+                std::string(list) + " clicked;");
+      EXPECT_EQ(Index(list), line);
+    }
+  }
+}
+
+TEST_F(Acting, PickOfALineThatLeavingTheBoxTakesAwayIsAClickBesideTheLines) {
+  Change([](Workbench& bench) { bench.txtName.LostFocus = [&bench] { bench.cboLocked.Clear(); }; });
+  Do("focus txtName");
+  EXPECT_EQ(ToldBy("pick cboLocked 2"), "");
+  EXPECT_EQ(Focus(), "frmBench.cboLocked");
 }
 
 TEST_F(Acting, PickIsRefusedForALineThatIsNotThere) {
@@ -211,6 +279,14 @@ TEST_F(Acting, AnotherDateFiresChangeAndTheSameOneNothing) {
   EXPECT_EQ(Refused("date txtName 2004-04-07"), "txtName has no date");
 }
 
+TEST_F(Acting, AnyDayOfAnyYearCanBePicked) {
+  for (const char* day : {"2004-02-29", "2004-03-01", "2004-08-01", "2003-12-31", "2005-05-31",
+                          "0100-01-02", "9999-12-31", "1899-12-30", "2026-11-30"}) {
+    EXPECT_EQ(ToldBy(std::string("date dtpDay ") + day), "dtpDay changed;") << day;
+    EXPECT_EQ(DateOf("dtpDay"), day);
+  }
+}
+
 TEST_F(Acting, KeysGoToTheControlWithTheFocus) {
   Do("focus txtName");
   Do("key Tab");
@@ -238,6 +314,17 @@ TEST_F(Acting, MnemonicsGoByTheirLetter) {
   EXPECT_EQ(Refused("key Alt+Q"), "frmBench has no live mnemonic Q");
 }
 
+TEST_F(Acting, FocusAloneClicksOnNothing) {
+  for (const char* name : {"txtName", "txtLocked", "cmdDo", "cmdEnd", "optBoth(0)", "optBoth(1)",
+                           "chkTick", "imgShape", "lstOne", "lstMany", "cboLocked", "cboFree",
+                           "grdTable", "dtpDay", "drvDrives", "dirFolders", "filFiles"}) {
+    EXPECT_EQ(ToldBy(std::string("focus ") + name), "") << name;
+    EXPECT_EQ(Focus(), std::string("frmBench.") + name);
+  }
+  EXPECT_FALSE(Ticked("chkTick"));
+  EXPECT_FALSE(Ticked("optBoth(1)"));
+}
+
 TEST_F(Acting, FocusGoesWhereItIsTaken) {
   Do("focus cboFree");
   EXPECT_EQ(Focus(), "frmBench.cboFree");
@@ -248,6 +335,28 @@ TEST_F(Acting, HoverReachesControlsAndTheBareScreen) {
   EXPECT_EQ(ToldBy("hover imgShape"), "imgShape hovered;");
   Do("hover frmBench");
   EXPECT_EQ(Refused("hover frmShelf"), "frmBench has no control frmShelf");
+}
+
+TEST_F(Acting, HoverIsRefusedWhereNobodyCouldAct) {
+  Change([](Workbench& bench) {
+    bench.imgShape.Disable();
+    bench.cmdOff.Hide();
+  });
+  EXPECT_EQ(Refused("hover imgShape"), "imgShape is disabled");
+  EXPECT_EQ(Refused("hover cmdOff"), "cmdOff is hidden");
+}
+
+TEST_F(Acting, AMenuStaysDownUntilSomethingElseIsDone) {
+  Do("click mnuFile");
+  Refused("click lblPlain");
+  Refused("pick lstOne 9");
+  EXPECT_EQ(ToldBy("key Alt+O"), "mnuOpen clicked;");
+  for (const char* line : {"hover imgShape", "hover frmBench", "click chkTick", "pick lstOne 0",
+                           "key Tab", "focus cmdDo", "type txtName x"}) {
+    Do("click mnuFile");
+    Do(line);
+    Refused("key Alt+O");
+  }
 }
 
 TEST_F(Acting, CloseUsesTheWindowsButton) {

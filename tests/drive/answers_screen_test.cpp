@@ -94,6 +94,11 @@ TEST_F(Answers, OfAnInputBoxAreTextsBlanksIncluded) {
   }
 }
 
+TEST_F(Answers, OfAnInputBoxAreRefusedForWhatNoKeyWrites) {
+  EXPECT_EQ(Refused("input A\tB"), "input: there is no key that writes character 9 into a box");
+  EXPECT_EQ(Waiting()["input"], 0);
+}
+
 TEST_F(Answers, MissingForAnInputBoxCancelIt) {
   AskForText();
   const Json expected = Json::parse(R"({"input": {"prompt": "How many ?", "title": "Title",

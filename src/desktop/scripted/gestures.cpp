@@ -42,6 +42,16 @@ void MoveMouse(QWidget& widget, QPoint at) {
   SendMouse(widget, QEvent::MouseMove, at, Qt::NoButton, Qt::NoButton, Qt::NoModifier);
 }
 
+void PressAndLeave(QWidget& widget, QPoint at) {
+  constexpr QPoint kBeside(-20, -20);
+  const QPointer<QWidget> still_there(&widget);
+  PressMouse(widget, at);
+  if (still_there) {
+    SendMouse(widget, QEvent::MouseMove, kBeside, Qt::NoButton, Qt::LeftButton, Qt::NoModifier);
+  }
+  if (still_there) ReleaseMouse(widget, kBeside);
+}
+
 void KeyDown(QWidget& widget, int key, Qt::KeyboardModifiers modifiers, const QString& text) {
   QKeyEvent press(QEvent::KeyPress, key, modifiers, text);
   QApplication::sendEvent(&widget, &press);

@@ -14,6 +14,8 @@ void ClickMouse(QWidget& widget, QPoint at, Qt::KeyboardModifiers modifiers = Qt
 /// The second click of a double click.
 void ClickMouseAgain(QWidget& widget, QPoint at);
 void MoveMouse(QWidget& widget, QPoint at);
+/// Presses the button, and lets it go beside the widget: brings the focus and clicks on nothing.
+void PressAndLeave(QWidget& widget, QPoint at);
 
 void KeyDown(QWidget& widget, int key, Qt::KeyboardModifiers modifiers = Qt::NoModifier,
              const QString& text = {});

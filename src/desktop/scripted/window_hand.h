@@ -1,11 +1,18 @@
 #pragma once
 
-#include <QPoint>
+#include <optional>
+#include <string>
+#include <string_view>
+#include <vector>
 
+#include "desktop/scripted/reach.h"
 #include "desktop/windows.h"
 #include "drive/face.h"
 
 namespace marlowbeck {
+
+[[nodiscard]] Outcome Refused(const Control& control, std::string_view why);
+[[nodiscard]] Outcome OutOfReach(const Control& control);
 
 /// Does a script's actions with mouse and keyboard on the windows, as far as a person could: what
 /// cannot be seen or is grey is refused, by the look of the widgets alone.
@@ -16,11 +23,6 @@ class WindowHand {
   Outcome Perform(const Action& action);
 
  private:
-  struct Place {
-    QWidget* widget = nullptr;  ///< what lies topmost there
-    QPoint at;
-  };
-
   Outcome Dispatch(const Action& action);
   Outcome Click(Control& control);
   Outcome ClickMenu(const Control& control);
@@ -44,10 +46,14 @@ class WindowHand {
 
   [[nodiscard]] View& ViewOf(const Control& control) const;
   [[nodiscard]] Outcome CheckLive(const Control& control) const;
+  [[nodiscard]] Outcome CheckSeen(const Screen& screen) const;
   [[nodiscard]] bool HasLine(const Control& control, int line) const;
-  [[nodiscard]] std::optional<Place> FreePlace(View& view) const;
-  Outcome ClickAt(const std::optional<Place>& place, const Control& control,
-                  Qt::KeyboardModifiers modifiers = Qt::NoModifier);
+  [[nodiscard]] bool HasCell(const Control& control, int row, int col) const;
+  /// The control is still there for the second click of a double click, and answers to it.
+  [[nodiscard]] bool TakesSecondClick(const Control& control) const;
+  /// Where the pointer is brought to, once what has dropped down is closed; nothing out of reach.
+  [[nodiscard]] std::optional<Place> Reach(View& view) const;
+  [[nodiscard]] std::optional<Place> ReachBesideLines(View& view) const;
   /// How what was just done went.
   Outcome Taken();
 

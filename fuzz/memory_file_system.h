@@ -52,6 +52,8 @@ class MemoryFileSystem : public FileSystem {
   std::vector<FolderEntry> List(const std::string&) override { return {}; }
   void ChangeFolder(const std::string&) override {}
   std::string CurrentFolder() override { return "/"; }
+  std::string WholePath(const std::string&) override { return "/"; }
+  std::vector<std::string> Drives() override { return {"/"}; }
 
  private:
   class MemoryFile : public File {

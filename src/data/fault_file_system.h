@@ -87,6 +87,8 @@ class FaultFileSystem : public FileSystem {
   std::vector<FolderEntry> List(const std::string& folder) override { return real_.List(folder); }
   void ChangeFolder(const std::string& folder) override { real_.ChangeFolder(folder); }
   std::string CurrentFolder() override { return real_.CurrentFolder(); }
+  std::string WholePath(const std::string& folder) override { return real_.WholePath(folder); }
+  std::vector<std::string> Drives() override { return real_.Drives(); }
 
  private:
   FileSystem& real_;

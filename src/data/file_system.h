@@ -57,9 +57,17 @@ class FileSystem {
   /// Makes a folder the one in which bare names lie.
   virtual void ChangeFolder(const std::string& folder) = 0;
   [[nodiscard]] virtual std::string CurrentFolder() = 0;
+  /// A folder's path from the root on, as it lies on the disk and without a separator at its end.
+  /// Throws PathNotFound when there is no such folder.
+  [[nodiscard]] virtual std::string WholePath(const std::string& folder) = 0;
+  /// The drives: letters as "C:", or the folders at which disks are mounted.
+  [[nodiscard]] virtual std::vector<std::string> Drives() = 0;
 };
 
 /// The part of a path after its last folder separator.
 [[nodiscard]] std::string FileNameOf(const std::string& path);
+/// The path of a name in a folder: with one separator between them, also where the folder is a
+/// root.
+[[nodiscard]] std::string PathIn(const std::string& folder, const std::string& name);
 
 }  // namespace marlowbeck

@@ -13,6 +13,7 @@
 #include <system_error>
 #include <utility>
 
+#include "data/drives.h"
 #include "data/runtime_error.h"
 #include "data/text.h"
 
@@ -84,6 +85,7 @@ void Check(const std::error_code& error, const fs::path& path) {
 }
 
 #ifdef _WIN32
+constexpr const char* kSeparators = "\\/";
 constexpr int kBinary = O_BINARY;
 constexpr int kSyncAccess = O_RDWR;
 int OpenDescriptor(const fs::path& path, int flags) { return _wopen(path.c_str(), flags, 0666); }
@@ -101,6 +103,7 @@ long WriteSome(int descriptor, const void* from, std::size_t size, std::uint64_t
   return _write(descriptor, from, static_cast<unsigned>(std::min<std::size_t>(size, 1U << 20)));
 }
 #else
+constexpr const char* kSeparators = "/";
 constexpr int kBinary = O_CLOEXEC;
 constexpr int kSyncAccess = O_RDONLY;  // a copy may be as read-only as its source
 int OpenDescriptor(const fs::path& path, int flags) { return ::open(path.c_str(), flags, 0666); }
@@ -260,12 +263,13 @@ std::string TextOfPath(const std::filesystem::path& path) {
 }
 
 std::string FileNameOf(const std::string& path) {
-#ifdef _WIN32
-  const auto separator = path.find_last_of("\\/");
-#else
-  const auto separator = path.find_last_of('/');
-#endif
+  const auto separator = path.find_last_of(kSeparators);
   return separator == std::string::npos ? path : path.substr(separator + 1);
+}
+
+std::string PathIn(const std::string& folder, const std::string& name) {
+  if (folder.empty() || folder.find_last_of(kSeparators) == folder.size() - 1) return folder + name;
+  return folder + static_cast<char>(fs::path::preferred_separator) + name;
 }
 
 RealFileSystem::RealFileSystem() {
@@ -277,7 +281,10 @@ std::filesystem::path RealFileSystem::Located(const std::string& path) const {
   if (path.empty() || path.find('\0') != std::string::npos) {
     throw RunTimeError(ErrorNumber::BadFileName);
   }
-  fs::path full = (current_ / PathOfText(path)).lexically_normal();
+  fs::path named = PathOfText(path);
+  // A drive alone is its root, wherever the program may stand on it.
+  if (named.has_root_name() && named == named.root_name()) named /= "/";
+  fs::path full = (current_ / named).lexically_normal();
   std::error_code error;
   if (fs::exists(full, error)) return full;
   fs::path located = full.root_path();
@@ -396,13 +403,22 @@ std::vector<FolderEntry> RealFileSystem::List(const std::string& folder) {
   return list;
 }
 
-void RealFileSystem::ChangeFolder(const std::string& folder) {
+std::filesystem::path RealFileSystem::LocatedFolder(const std::string& folder) const {
   const fs::path located = Located(folder);
   std::error_code error;
   if (!fs::is_directory(located, error)) throw RunTimeError(ErrorNumber::PathNotFound);
-  current_ = located;
+  // A separator at its end is none of its name.
+  return located.has_filename() ? located : located.parent_path();
 }
 
+void RealFileSystem::ChangeFolder(const std::string& folder) { current_ = LocatedFolder(folder); }
+
 std::string RealFileSystem::CurrentFolder() { return TextOfPath(current_); }
+
+std::string RealFileSystem::WholePath(const std::string& folder) {
+  return TextOfPath(LocatedFolder(folder));
+}
+
+std::vector<std::string> RealFileSystem::Drives() { return DrivesOfMachine(); }
 
 }  // namespace marlowbeck

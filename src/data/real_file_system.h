@@ -23,11 +23,15 @@ class RealFileSystem : public FileSystem {
   std::vector<FolderEntry> List(const std::string& folder) override;
   void ChangeFolder(const std::string& folder) override;
   std::string CurrentFolder() override;
+  std::string WholePath(const std::string& folder) override;
+  std::vector<std::string> Drives() override;
 
  private:
   /// The file or folder that a text names: in the current folder when bare, with each part in the
   /// case in which it lies on the disk when it does.
   [[nodiscard]] std::filesystem::path Located(const std::string& path) const;
+  /// The same for a folder, which has to be there.
+  [[nodiscard]] std::filesystem::path LocatedFolder(const std::string& folder) const;
 
   std::filesystem::path current_;
 };

@@ -1,27 +1,17 @@
 #include "drive/script_dialogs.h"
 
-#include <filesystem>
 #include <utility>
+
+#include "data/file_system.h"
 
 namespace marlowbeck {
 namespace {
 
-#ifdef _WIN32
-constexpr const char* kSeparators = "\\/";
-#else
-constexpr const char* kSeparators = "/";
-#endif
-
-std::string InFolder(const std::string& folder, const std::string& name) {
-  if (folder.empty() || folder.find_last_of(kSeparators) == folder.size() - 1) return folder + name;
-  return folder + static_cast<char>(std::filesystem::path::preferred_separator) + name;
-}
-
 /// What the dialog hands back for what the script chose.
 std::string HandedBack(const std::string& chosen, const FileDialogRequest& request) {
   if (chosen.starts_with('*')) return request.name.starts_with('*') ? request.name : request.filter;
-  if (chosen.find_first_of(kSeparators) != std::string::npos) return chosen;
-  return InFolder(request.folder, chosen);
+  if (FileNameOf(chosen) != chosen) return chosen;
+  return PathIn(request.folder, chosen);
 }
 
 Json FontAsJson(const FontChoice& font) {

@@ -290,6 +290,46 @@ TEST_F(RealFiles, BareNamesLieInTheCurrentFolder) {
   EXPECT_EQ(Read("../Club/a.txt"), "a");
 }
 
+TEST_F(RealFiles, TheFolderAboveHasNoSeparatorAtItsEnd) {
+  files.MakeFolder("Club");
+  files.ChangeFolder("Club");
+  files.ChangeFolder("..");
+  EXPECT_EQ(files.CurrentFolder(), folder.Path());
+  files.ChangeFolder("club/");
+  EXPECT_EQ(files.CurrentFolder(), folder.In("Club"));
+  files.ChangeFolder("/");
+  EXPECT_EQ(files.CurrentFolder(), "/");
+  files.ChangeFolder("..");
+  EXPECT_EQ(files.CurrentFolder(), "/");
+}
+
+TEST_F(RealFiles, AWholePathIsSpelledAsItLiesOnTheDisk) {
+  files.MakeFolder("Club");
+  files.MakeFolder("Club/Old");
+  EXPECT_EQ(files.WholePath("CLUB/old/"), folder.In("Club/Old"));
+  EXPECT_EQ(files.WholePath("club/old/.."), folder.In("Club"));
+  EXPECT_EQ(files.WholePath("."), folder.Path());
+  EXPECT_EQ(files.WholePath("/.."), "/");
+  Write("a.txt", "");
+  EXPECT_ERROR(76, (void)files.WholePath("a.txt"));
+  EXPECT_ERROR(76, (void)files.WholePath("gone"));
+  EXPECT_ERROR(52, (void)files.WholePath(""));
+}
+
+TEST_F(RealFiles, DrivesAreFoldersTheRootBeingTheFirst) {
+  const auto drives = files.Drives();
+  ASSERT_FALSE(drives.empty());
+  EXPECT_EQ(drives[0], "/");
+  for (const std::string& drive : drives) EXPECT_EQ(files.WholePath(drive), drive);
+}
+
+TEST(PathIn, HasOneSeparatorBetweenFolderAndName) {
+  EXPECT_EQ(PathIn("/home/club", "a.txt"), "/home/club/a.txt");
+  EXPECT_EQ(PathIn("/home/club/", "a.txt"), "/home/club/a.txt");
+  EXPECT_EQ(PathIn("/", "a.txt"), "/a.txt");
+  EXPECT_EQ(PathIn("", "a.txt"), "a.txt");
+}
+
 TEST(FileNameOf, IsWhatFollowsTheLastSeparator) {
   EXPECT_EQ(FileNameOf("/home/club/Winter.qza"), "Winter.qza");
   EXPECT_EQ(FileNameOf("Winter.qza"), "Winter.qza");

@@ -153,8 +153,12 @@ struct frmResults : Screen {
   void GoToDate(Date date, const char* asked_as);
   [[nodiscard]] bool FindPlayer(const ListBox& list);
   void ShowPlayer(const PlayerRecord& player);
+  void OpenSavedResult();
   [[nodiscard]] int FindSavedResult();
   void ShowForCorrection();
+  /// Back to the lists as they stand, without a look at the files: what the sheet was opened for
+  /// cannot be done any more.
+  void CloseSheet();
   [[nodiscard]] bool ScoresPass();
   void RestoreWhenEditing();
   [[nodiscard]] bool DateIsTaken();

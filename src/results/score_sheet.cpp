@@ -70,9 +70,19 @@ void frmResults::ShowPlayer(const PlayerRecord& player) {
 }
 
 void frmResults::lstFinished_Click() {
-  Session& session = context_.session;
   EnableBoxes();
   ClearResults();
+  try {
+    OpenSavedResult();
+  } catch (const RunTimeError&) {
+    // A sheet that is half open would be saved as a new one.
+    CloseSheet();
+    throw;
+  }
+}
+
+void frmResults::OpenSavedResult() {
+  Session& session = context_.session;
   if (FindPlayer(lstFinished)) scores.txtAgg.SetFocus();
   session.EditRecord = 0;
   const int number = FindSavedResult();
@@ -81,6 +91,14 @@ void frmResults::lstFinished_Click() {
   WhichBoxes();
   scores.Fill(record_);
   ShowForCorrection();
+}
+
+void frmResults::CloseSheet() {
+  context_.session.EditRecord = 0;
+  fraResults.Hide();
+  fraEdButtons.Hide();
+  fraResControls.Show();
+  fraTeams.Show();
 }
 
 /// The last result of the player in hand for this team, opposition and date, which is then in the

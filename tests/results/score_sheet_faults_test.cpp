@@ -108,6 +108,26 @@ TEST(ScoreSheetFaults, ACorrectionIsOldOrNewAfterAPowerCut) {
   EXPECT_GT(SweepPowerCuts(Correction()), 5);
 }
 
+TEST(ScoreSheetFaults, ASheetThatCannotBeReadIsNotLeftHalfOpen) {
+  const SweptWork work = {[](Club& club) {
+                            LayLeague(club);
+                            club.WriteResults(kAResults, Before());
+                            club.DoAll(ToTeam("A Grade", "Hawks"));
+                            club.Do("focus lstFinished");
+                          },
+                          {"pick lstFinished =Hill,  Al"},
+                          [](Club& club) {
+                            const bool open = club.Shown("fraResults");
+                            EXPECT_EQ(open, club.Shown("fraEdButtons"));
+                            EXPECT_NE(open, club.Shown("fraTeams"));
+                            EXPECT_NE(open, club.Shown("fraResControls"));
+                            EXPECT_EQ(club.InSession("EditRecord"), open ? 2 : 0);
+                            EXPECT_EQ(club.Text("txtAgg"), open ? "950" : "");
+                            EXPECT_EQ(club.File(kAResults), FileOf(Before()));
+                          }};
+  EXPECT_GT(SweepFailures(work), 5);
+}
+
 TEST(ScoreSheetFaults, EnteringAGradeAndKeepingTheWorkDateLeaveAWholeDate) {
   const SweptWork work = {[](Club& club) {
                             LayLeague(club);

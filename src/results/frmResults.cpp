@@ -47,13 +47,13 @@ frmResults::frmResults(Screens& screens, const Context& context)
   cmdClearRes.Click = [this] { cmdClearRes_Click(); };
   cmdResultsCancel.Click = [this] { RePick(); };
   EdCal.Change = [this] { EdCal_Change(); };
+  cmdEdDelete.Click = [this] { cmdEdDelete_Click(); };
 
   txtDayName.SetLocked(true);
   txtDayName.SetTabStop(false);
   fraResults.SetMeaning(Meaning::Black);
   Defaults = {&cmdSave, &cmdGotoResults};
   Cancels = {&cmdResultsCancel, &cmdExit};
-  Helps = {&cmdHelp1};
 }
 
 void frmResults::Load() {

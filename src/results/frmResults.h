@@ -140,6 +140,9 @@ struct frmResults : Screen {
   void CheckCenturies();
   void cmdSave_Click();
 
+  // Putting right what was saved.
+  void cmdEdDelete_Click();
+
  private:
   void ListTeams();
   [[nodiscard]] bool FindTwoTeams();
@@ -165,6 +168,9 @@ struct frmResults : Screen {
   void KeepOldDate();
   void FillRecord();
   void WriteRecord();
+  [[nodiscard]] int AskToDelete();
+  /// Lets a work file without the record in hand take the place of the results.
+  void PutInPlace(const std::string& work_file);
   [[nodiscard]] bool IsOutOfOrder();
   void NameFileToSort();
   void OpenHelp();

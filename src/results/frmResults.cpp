@@ -49,11 +49,15 @@ frmResults::frmResults(Screens& screens, const Context& context)
   EdCal.Change = [this] { EdCal_Change(); };
   cmdEdDelete.Click = [this] { cmdEdDelete_Click(); };
 
+  panChangeOpp.Click = [this] { panChangeOpp_Click(); };
+  cmdSaveOp.Click = [this] { cmdSaveOp_Click(); };
+  SSCommand3.Click = [this] { BackToTeams(); };
+
   txtDayName.SetLocked(true);
   txtDayName.SetTabStop(false);
   fraResults.SetMeaning(Meaning::Black);
-  Defaults = {&cmdSave, &cmdGotoResults};
-  Cancels = {&cmdResultsCancel, &cmdExit};
+  Defaults = {&cmdSave, &cmdSaveOp, &cmdGotoResults};
+  Cancels = {&cmdResultsCancel, &SSCommand3, &cmdExit};
 }
 
 void frmResults::Load() {

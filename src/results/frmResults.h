@@ -2,6 +2,7 @@
 
 #include <array>
 #include <functional>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -13,6 +14,8 @@
 #include "ui/screen.h"
 
 namespace marlowbeck {
+
+struct OppositionSwap;
 
 /// Score sheets: from grade and date by way of team, opposition and player to the boxes of one
 /// night, whose record goes to the results file of the grade. Layers of panels replace one another:
@@ -142,6 +145,8 @@ struct frmResults : Screen {
 
   // Putting right what was saved.
   void cmdEdDelete_Click();
+  void panChangeOpp_Click();
+  void cmdSaveOp_Click();
 
  private:
   void ListTeams();
@@ -171,6 +176,11 @@ struct frmResults : Screen {
   [[nodiscard]] int AskToDelete();
   /// Lets a work file without the record in hand take the place of the results.
   void PutInPlace(const std::string& work_file);
+  void BackToTeams();
+  [[nodiscard]] std::optional<std::string> SideThatMeets(const OppositionSwap& swap);
+  void RefuseSwap(const OppositionSwap& swap, const std::string& side);
+  [[nodiscard]] int AskToSwap(const OppositionSwap& swap, const std::string& opposition);
+  void ChangeResults(const OppositionSwap& swap);
   [[nodiscard]] bool IsOutOfOrder();
   void NameFileToSort();
   void OpenHelp();

@@ -75,5 +75,14 @@ TEST_F(Guards, ASixthSheetIsNot) {
   EXPECT_TRUE(club_.Shown("fraResults"));
 }
 
+TEST_F(Guards, ASwapWithNobodyToSwapToLeavesTheTeamsUp) {
+  Open({Night(11, "Hawks", "Lions"), Night(31, "Cubs", "Rovers")});
+  EXPECT_FALSE(club_.Shown("panChangeOpp"));
+  Run([&] { Sheets().panChangeOpp_Click(); });
+  EXPECT_TRUE(club_.Shown("fraTeams"));
+  EXPECT_FALSE(club_.Shown("fraReDoOpp"));
+  EXPECT_TRUE(club_.Lines("cboReDoOpp").empty());
+}
+
 }  // namespace
 }  // namespace marlowbeck

@@ -10,6 +10,7 @@ namespace {
 
 constexpr const char* kSortFile = "resfile.qz3";
 constexpr int kHelpTopic = 140;
+constexpr int kHelpTopicOfAdding = 255;
 
 }  // namespace
 
@@ -21,7 +22,7 @@ frmResults::frmResults(Screens& screens, const Context& context)
   Cal.Change = [this] { Cal_Change(); };
   cmdGotoResults.Click = [this] { StartScores(); };
   cmdExit.Click = [this] { cmdExit_Click(); };
-  cmdHelp1.Click = [this] { OpenHelp(); };
+  cmdHelp1.Click = [this] { OpenHelp(kHelpTopic); };
 
   cboResTeam.Click = [this] { cboResTeam_Click(); };
   cboOpp.Click = [this] { cboOpp_Click(); };
@@ -52,12 +53,16 @@ frmResults::frmResults(Screens& screens, const Context& context)
   panChangeOpp.Click = [this] { panChangeOpp_Click(); };
   cmdSaveOp.Click = [this] { cmdSaveOp_Click(); };
   SSCommand3.Click = [this] { BackToTeams(); };
+  panAddNames.Click = [this] { panAddNames_Click(); };
+  cmdAddSave0.Click = [this] { cmdAddSave0_Click(); };
+  cmdAddCancel0.Click = [this] { cmdAddCancel0_Click(); };
+  SSCommand1.Click = [this] { OpenHelp(kHelpTopicOfAdding); };
 
   txtDayName.SetLocked(true);
   txtDayName.SetTabStop(false);
   fraResults.SetMeaning(Meaning::Black);
-  Defaults = {&cmdSave, &cmdSaveOp, &cmdGotoResults};
-  Cancels = {&cmdResultsCancel, &SSCommand3, &cmdExit};
+  Defaults = {&cmdSave, &cmdAddSave0, &cmdSaveOp, &cmdGotoResults};
+  Cancels = {&cmdResultsCancel, &cmdAddCancel0, &SSCommand3, &cmdExit};
 }
 
 void frmResults::Load() {
@@ -73,9 +78,9 @@ void frmResults::Activate() {
   if (std::exchange(away_in_setup_, false)) Start();
 }
 
-void frmResults::HelpKey() { OpenHelp(); }
+void frmResults::HelpKey() { OpenHelp(SSCommand1.Live() ? kHelpTopicOfAdding : kHelpTopic); }
 
-void frmResults::OpenHelp() { context_.platform.help.Open("qz1.HLP", kHelpTopic); }
+void frmResults::OpenHelp(int topic) { context_.platform.help.Open("qz1.HLP", topic); }
 
 void frmResults::cmdExit_Click() {
   if (fraTeams.Visible()) {

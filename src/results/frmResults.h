@@ -15,6 +15,7 @@
 
 namespace marlowbeck {
 
+class NextPlayer;
 struct OppositionSwap;
 
 /// Score sheets: from grade and date by way of team, opposition and player to the boxes of one
@@ -148,6 +149,11 @@ struct frmResults : Screen {
   void panChangeOpp_Click();
   void cmdSaveOp_Click();
 
+  // Somebody who is not listed yet.
+  void panAddNames_Click();
+  void cmdAddSave0_Click();
+  void cmdAddCancel0_Click();
+
  private:
   void ListTeams();
   [[nodiscard]] bool FindTwoTeams();
@@ -181,9 +187,12 @@ struct frmResults : Screen {
   void RefuseSwap(const OppositionSwap& swap, const std::string& side);
   [[nodiscard]] int AskToSwap(const OppositionSwap& swap, const std::string& opposition);
   void ChangeResults(const OppositionSwap& swap);
+  void PutNewPlayer();
+  [[nodiscard]] PlayerRecord PlayerToAdd(const NextPlayer& next) const;
+  [[nodiscard]] bool EndsUnconfirmed();
   [[nodiscard]] bool IsOutOfOrder();
   void NameFileToSort();
-  void OpenHelp();
+  void OpenHelp(int topic);
 
   const Context& context_;
   bool away_in_setup_ = false;  ///< gone to add a team that the grade lacks
@@ -191,6 +200,8 @@ struct frmResults : Screen {
   /// record; it is always read anew, if there is anything to read, before a sheet opens.
   ResultRecord record_;
   int other_teams_ = 0;  ///< of the grade, as GetOpp last counted them
+  /// A player written from the open panel whose save has not come to its end.
+  std::optional<PlayerBytes> unconfirmed_;
 };
 
 }  // namespace marlowbeck

@@ -37,9 +37,11 @@ constexpr int kLineHeight = 24;
 constexpr int kLineAir = 6;
 constexpr int kCardTitleIndent = 24;
 
-bool IsCard(const QWidget* widget) {
-  return widget != nullptr && widget->property("role") == "card";
+bool Plays(const QWidget* widget, const char* role) {
+  return widget != nullptr && widget->property("role") == role;
 }
+
+bool IsCard(const QWidget* widget) { return Plays(widget, "card"); }
 
 /// Fusion with our measures and our icons.
 class Style : public QProxyStyle {
@@ -82,6 +84,18 @@ class Style : public QProxyStyle {
     const auto meaning = static_cast<Meaning>(widget->property(kMeaning).toInt());
     own.palette.setColor(QPalette::WindowText, ColorOf(meaning));
     QProxyStyle::drawComplexControl(control, &own, painter, widget);
+  }
+
+  /// A panel that is clicked looks like what is clicked elsewhere.
+  void drawControl(ControlElement element, const QStyleOption* option, QPainter* painter,
+                   const QWidget* widget) const override {
+    if (element != CE_ShapedFrame || !Plays(widget, "button")) {
+      return QProxyStyle::drawControl(element, option, painter, widget);
+    }
+    QStyleOptionButton button;
+    button.QStyleOption::operator=(*option);
+    button.state |= State_Raised;
+    drawPrimitive(PE_PanelButtonCommand, &button, painter, widget);
   }
 
   QIcon standardIcon(StandardPixmap icon, const QStyleOption* option,

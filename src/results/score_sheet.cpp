@@ -48,7 +48,7 @@ void frmResults::GotPlayer() {
 bool frmResults::FindPlayer(const ListBox& list) {
   if (list.Index() < 0) return false;
   const Session& session = context_.session;
-  const std::string line = list.Line(list.Index());
+  const std::string& line = list.Line(list.Index());
   bool found = false;
   OpenFile(context_.session, context_.channels);
   context_.channels.ForEachRecord(Channel::Players, [&](Bytes bytes, int) {

@@ -127,6 +127,7 @@ void frmResults::NameFileToSort() {
 
 void frmResults::ForEachResult(const std::function<bool(const ResultView&, int)>& visit) {
   const int total = context_.channels.RecordCount(Channel::Results);
+  if (total == 0) record_ = {};
   context_.channels.ForEachRecord(Channel::Results, [&](Bytes bytes, int number) {
     const bool go_on = visit(ResultView(bytes), number);
     if (!go_on || number == total) record_ = DecodeResult(bytes);

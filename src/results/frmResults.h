@@ -197,7 +197,7 @@ struct frmResults : Screen {
   const Context& context_;
   bool away_in_setup_ = false;  ///< gone to add a team that the grade lacks
   /// The one record buffer of the screen, in which readings of the results file leave their last
-  /// record; it is always read anew, if there is anything to read, before a sheet opens.
+  /// record, and those of an empty file blanks; always read anew before a sheet opens.
   ResultRecord record_;
   int other_teams_ = 0;  ///< of the grade, as GetOpp last counted them
   /// A player written from the open panel whose save has not come to its end.

@@ -186,6 +186,17 @@ TEST_F(ChangeOpposition, AfterwardsTheDatesAreThoseOfTheWorkDateWhichIsKept) {
   EXPECT_EQ(File("WkDate.qz3"), "#2004-03-24#\r\n");
 }
 
+TEST_F(ChangeOpposition, ADatePickedMeanwhileGivesWayToTheWorkDate) {
+  Open(entered);
+  DoAll({"click cmdChangeGrade", "date Cal 2004-04-07"});
+  SwapTo("Cubs");
+  EXPECT_EQ(Trim(Saved()[1].Opposition), "Cubs");
+  EXPECT_EQ(DateOf("Cal"), "2004-03-31");
+  EXPECT_EQ(DateOf("EdCal"), "2004-03-31");
+  EXPECT_EQ(Caption("lblHeader(1)"), "Wednesday, 31 March 2004");
+  EXPECT_EQ(File("WkDate.qz3"), "#2004-03-31#\r\n");
+}
+
 TEST_F(ChangeOpposition, WithNothingEnteredNothingIsWritten) {
   WriteResults(kAResults, {entered[0]});
   OpenTeam("Hawks");

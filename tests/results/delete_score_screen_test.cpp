@@ -181,6 +181,16 @@ TEST_F(DeleteScore, AfterADeletionTheNextSheetIsANewRecord) {
   EXPECT_EQ(saved[3].Aggregate, 1000);
 }
 
+TEST_F(DeleteScore, AfterTheOnlyRecordTheNextOneTakesNothingOver) {
+  ResultRecord only = Night(11, "Hawks", "Lions");
+  only.Grade = "Old Name";
+  Open({only});
+  Delete();
+  SaveGoodSheet("Hill,  Al");
+  ASSERT_EQ(Saved().size(), 1U);
+  EXPECT_EQ(Saved()[0].Grade, std::string(20, ' '));
+}
+
 TEST_F(DeleteScore, AnUnansweredQuestionIsANo) {
   Open(four);
   const std::string before = File(kAResults);

@@ -262,6 +262,18 @@ TEST_F(SaveSheet, TheGradeStaysWhatTheRecordBufferLastHeld) {
   EXPECT_EQ(Trim(Saved()[1].Grade), "Old Name");
 }
 
+TEST_F(SaveSheet, TheGradeIsBlankInAnEmptyFileAfterAnotherGradesFile) {
+  ResultRecord other = Night(41, "Bees", "Crows");
+  other.Grade = "Old Name";
+  WriteResults(kBResults, {other});
+  OpenTeam("Bees", "B Grade");
+  DoAll({"click cmdChangeGrade", "pick cboResGrade =A Grade", "click cmdGotoResults",
+         "pick cboResTeam =Hawks"});
+  SaveGoodSheet("Hill,  Al");
+  ASSERT_EQ(Saved().size(), 1U);
+  EXPECT_EQ(Saved()[0].Grade, std::string(20, ' '));
+}
+
 TEST_F(SaveSheet, TheGradeIsBlankInAFreshFile) {
   OpenSheet();
   Save();

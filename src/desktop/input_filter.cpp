@@ -194,13 +194,11 @@ bool InputFilter::MousePress(QObject& watched, ScreenWindow& window, const QMous
 
 bool InputFilter::SecondPress(QObject& watched, ScreenWindow& window, const QMouseEvent& event) {
   View* const view = window.ViewAt(&watched);
-  if (view == nullptr || !view->GetControl().DoubleClick) {
+  if (view == nullptr || !AnswersDoubleClick(view->GetControl())) {
     return MousePress(watched, window, event);
   }
   if (event.button() != Qt::LeftButton || swallowing_) return true;
-  Control& control = view->GetControl();
-  windows_.Do(view, [&](Hand& hand) { return hand.SecondClick(control); });
-  return true;
+  return view->PressedAgain(static_cast<const QWidget&>(watched), event);
 }
 
 bool InputFilter::MouseRelease(const QObject& watched, ScreenWindow& window,

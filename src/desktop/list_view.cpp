@@ -4,6 +4,7 @@
 #include <QTimer>
 
 #include "desktop/encoding.h"
+#include "ui/disk_lists.h"
 
 namespace marlowbeck {
 
@@ -34,7 +35,7 @@ void ListView::ShowKind() {
   shown_line_ = line;
   list_.setAccessibleDescription(model_.GetKind() == Kind::Folders ||
                                          model_.GetKind() == Kind::Files
-                                     ? ToQt(static_cast<const DiskList&>(model_).Path())
+                                     ? ToQt(static_cast<const PathList&>(model_).Path())
                                      : QString());
 }
 
@@ -98,6 +99,21 @@ bool ListView::Pressed(const QWidget& on, const QMouseEvent& event) {
   const QModelIndex index = list_.indexAt(event.position().toPoint());
   if (index.isValid()) PressLine(index.row(), event.modifiers());
   return true;
+}
+
+/// A second click on a line, where the first has been told already.
+bool ListView::PressedAgain(const QWidget& on, const QMouseEvent& event) {
+  const QModelIndex index =
+      &on == list_.viewport() ? list_.indexAt(event.position().toPoint()) : QModelIndex();
+  if (!index.isValid()) return CaptionedView::PressedAgain(on, event);
+  Do([=, this](Hand& hand) { return hand.SecondPick(model_, index.row()); });
+  return true;
+}
+
+/// Beside the lines.
+bool ListView::ClicksAt(const QWidget& on, QPoint at) const {
+  return model_.MouseUp &&
+         (&on == &list_ || (&on == list_.viewport() && !list_.indexAt(at).isValid()));
 }
 
 void ListView::PressLine(int line, Qt::KeyboardModifiers modifiers) {

@@ -114,7 +114,8 @@ class Control {
   Handler GotFocus;
   Handler LostFocus;
   Handler MouseMove;
-  Handler KeyUp;  ///< a key has come up in a list
+  Handler MouseUp;  ///< the button has come up over a list, after what the click did
+  Handler KeyUp;    ///< a key has come up in a list
 
   /// Runs a handler of this control, if there is one, through the dispatcher.
   void Fire(const Handler& handler) const;

@@ -1,6 +1,7 @@
 #include "ui/control_state.h"
 
 #include "ui/controls.h"
+#include "ui/disk_lists.h"
 
 namespace marlowbeck {
 namespace {
@@ -51,7 +52,7 @@ void AddFieldsOfKind(ControlState& state, const Control& control) {
       return;
     case Kind::Folders:
     case Kind::Files:
-      state.path = static_cast<const DiskList&>(control).Path();
+      state.path = static_cast<const PathList&>(control).Path();
       [[fallthrough]];
     case Kind::Drives:
     case Kind::List:

@@ -169,18 +169,6 @@ class ListBox : public LineHolder {
   std::set<int> marked_;
 };
 
-/// The drives, folders or files of a disk, filled by the screen; folders and files have a path.
-class DiskList : public ListBox {
- public:
-  DiskList(const Owner& owner, Kind kind, std::string_view name, std::string_view caption = {})
-      : ListBox(owner, kind, name, caption) {}
-  [[nodiscard]] const std::string& Path() const { return path_; }
-  void SetPath(std::string_view path) { Assign(path_, path); }
-
- private:
-  std::string path_;
-};
-
 /// A list that drops down. A locked one can be picked from only; by program its text may be
 /// anything all the same.
 class ComboBox : public LineHolder {

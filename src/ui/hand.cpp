@@ -4,6 +4,7 @@
 #include <utility>
 
 #include "data/text.h"
+#include "ui/disk_lists.h"
 
 namespace marlowbeck {
 namespace {
@@ -110,7 +111,7 @@ void Hand::ClickWithFocus(Control& control) {
     if (option->Value()) return;
     option->SetValue(true);
   } else if (As<LineHolder>(control) != nullptr) {
-    return;  // beside the lines
+    return control.Fire(control.MouseUp);  // beside the lines
   }
   control.Fire(control.Click);
 }
@@ -169,11 +170,27 @@ Outcome Hand::Pick(Control& control, int line) {
   if (line < 0 || line >= list->Count()) return Refused(control, "has no such line");
   return Act(control, [=] {
     if (line < list->Count()) PickLine(*list, line);
+    list->Fire(list->MouseUp);
   });
 }
 
 Outcome Hand::PickTwice(Control& control, int line) {
-  return Twice(control, [&] { return Pick(control, line); });
+  const auto held = screens_.Hold(control.InScreen());
+  Outcome outcome = Pick(control, line);
+  // The list of a combo has gone with the first click.
+  const bool stays = As<ListBox>(control) != nullptr;
+  if (stays && outcome.Done() && !outcome.lost) SecondPick(control, line);
+  return outcome;
+}
+
+Outcome Hand::SecondPick(Control& control, int line) {
+  auto* const folders = As<FolderList>(control);
+  if (folders == nullptr) return SecondClick(control);
+  if (Outcome check = CheckLive(control); !check.Done()) return check;
+  return Whole([&] {
+    if (line >= 0 && line < folders->Count()) folders->Open(line);
+    control.Fire(control.DoubleClick);
+  });
 }
 
 /// Why these lines of a list cannot be marked; empty when they can.
@@ -209,6 +226,7 @@ Outcome Hand::Toggle(Control& control, int line) {
     if (line >= list.Count()) return;
     list.SetMarked(line, !list.Marked().contains(line));
     list.SetIndex(line);
+    list.Fire(list.MouseUp);
   });
 }
 
@@ -222,6 +240,7 @@ Outcome Hand::MarkThrough(Control& control, int from, int to) {
       list.SetMarked(line, true);
     }
     list.SetIndex(to);
+    list.Fire(list.MouseUp);
   });
 }
 
@@ -341,6 +360,11 @@ void Hand::PressEnter(Control* focus, Screen& front) {
           return;
         }
         break;
+      case Kind::Folders:
+        if (auto& folders = static_cast<FolderList&>(*focus); folders.Index() >= 0) {
+          return folders.Open(folders.Index());
+        }
+        break;
       default:
         break;
     }
@@ -401,6 +425,10 @@ Control* Hand::WithMnemonic(const Screen& front, char letter) const {
     }
   }
   return nullptr;
+}
+
+bool AnswersDoubleClick(const Control& control) {
+  return control.DoubleClick || control.GetKind() == Kind::Folders;
 }
 
 char MnemonicOf(std::string_view caption) {

@@ -39,6 +39,8 @@ class Hand {
   Outcome Retype(Control& control, std::string_view text);
   Outcome Pick(Control& control, int line);
   Outcome PickTwice(Control& control, int line);
+  /// The second click of a double click on a line, which opens a folder.
+  Outcome SecondPick(Control& control, int line);
   /// Marks just these lines of a list: a click on the first and a control-click on each other one.
   /// None unmarks all. It ends where a click takes the list away.
   Outcome Select(Control& control, const std::vector<int>& lines);
@@ -86,6 +88,9 @@ class Hand {
   Boxes& boxes_;
   const Control* open_menu_ = nullptr;
 };
+
+/// A second click on the control means more than one click more.
+[[nodiscard]] bool AnswersDoubleClick(const Control& control);
 
 /// The letter after a single "&" in a caption, upper-cased; 0 for none.
 [[nodiscard]] char MnemonicOf(std::string_view caption);

@@ -141,7 +141,7 @@ TEST_F(Acting, TypeIsRefusedOnWhatIsLocked) {
 }
 
 TEST_F(Acting, PickClicksALineByItsNumberOrItsText) {
-  for (const char* list : {"lstOne", "cboLocked", "drvDrives", "dirFolders", "filFiles"}) {
+  for (const char* list : {"lstOne", "cboLocked"}) {
     EXPECT_EQ(ToldBy("pick " + std::string(list) + " 2"), std::string(list) + " clicked;");
     EXPECT_EQ(Index(list), 2);
     EXPECT_EQ(ToldBy("pick " + std::string(list) + " =second"), std::string(list) + " clicked;");

@@ -32,12 +32,14 @@ struct KindState {
 class StateOfKind : public WorkbenchTest, public ::testing::WithParamInterface<KindState> {};
 
 TEST_P(StateOfKind, HasTheFieldsOfTheKindAndNoOther) {
+  for (const char* file : {"a/x", "B/y", "c.txt", "D"}) WriteFile(file, "");
   Json expected = {{"name", GetParam().control},
                    {"kind", GetParam().kind},
                    {"visible", true},
                    {"shown", true},
                    {"enabled", true}};
   expected.update(Json::parse(GetParam().fields));
+  if (expected.contains("path")) expected["path"] = Folder().string();
   EXPECT_EQ(Get(GetParam().control), expected);
 }
 
@@ -55,12 +57,10 @@ INSTANTIATE_TEST_SUITE_P(
         KindState{"lstOne", "list", R"({"lines": ["first", "second", "third"], "index": -1})"},
         KindState{"lstMany", "list",
                   R"({"lines": ["first", "second", "third"], "index": -1, "selected": []})"},
-        KindState{"drvDrives", "drives", R"({"lines": ["first", "second", "third"], "index": -1})"},
         KindState{"dirFolders", "folders",
-                  R"({"lines": ["first", "second", "third"], "index": -1, "path": "/club/data"})"},
+                  R"({"lines": ["..", "a", "B"], "index": -1, "path": "{folder}"})"},
         KindState{"filFiles", "files",
-                  R"({"lines": ["first", "second", "third"], "index": -1, "selected": [],
-                      "path": "/club/data"})"},
+                  R"({"lines": ["c.txt", "D"], "index": -1, "selected": [], "path": "{folder}"})"},
         KindState{"cboFree", "combo",
                   R"({"text": "", "lines": ["first", "second", "third"], "index": -1,
                       "locked": false})"},
@@ -77,6 +77,15 @@ INSTANTIATE_TEST_SUITE_P(
       std::erase_if(name, [](char c) { return c == '(' || c == ')'; });
       return name;
     });
+
+TEST_F(Looking, StateOfDrivesHasTheMountPoints) {
+  const Json state = Get("drvDrives");
+  EXPECT_EQ(state["kind"], "drives");
+  EXPECT_EQ(state["lines"][0], "/");
+  EXPECT_EQ(state["index"], -1);
+  EXPECT_FALSE(state.contains("path"));
+  EXPECT_FALSE(state.contains("selected"));
+}
 
 TEST_F(Looking, StateTellsOwnVisibilityFromBeingShown) {
   Change([](Workbench& bench) { bench.fraPlain.Hide(); });

@@ -21,15 +21,16 @@ struct Door : Screen {
 Workbench::Workbench(Screens& screens, const Context& in)
     : Screen(screens, "frmBench", "Workbench"), context(in) {
   for (const char* line : {"first", "second", "third"}) {
-    for (LineHolder* list : std::initializer_list<LineHolder*>{
-             &lstOne, &lstMany, &cboLocked, &cboFree, &drvDrives, &dirFolders, &filFiles}) {
+    for (LineHolder* list :
+         std::initializer_list<LineHolder*>{&lstOne, &lstMany, &cboLocked, &cboFree}) {
       list->AddLine(line);
     }
   }
   lstMany.SetMulti(true);
   filFiles.SetMulti(true);
-  dirFolders.SetPath("/club/data");
-  filFiles.SetPath("/club/data");
+  drvDrives.Refresh();
+  dirFolders.SetPath(context.working_folder);
+  filFiles.SetPath(context.working_folder);
   grdTable.SetSize(2, 3);
   grdTable.SetCell(0, 0, "Name");
   grdTable.SetCell(1, 2, "17.89");

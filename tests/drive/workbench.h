@@ -5,10 +5,12 @@
 
 #include "support/club.h"
 #include "ui/controls.h"
+#include "ui/disk_lists.h"
 
 namespace marlowbeck {
 
-/// A screen with every kind of control, to try the script's words on.
+/// A screen with every kind of control, to try the script's words on. Its disk is the working
+/// folder.
 struct Workbench : Screen {
   Workbench(Screens& screens, const Context& in);
 
@@ -39,9 +41,11 @@ struct Workbench : Screen {
   Grid grdTable{*this, "grdTable", "Table"};
   DatePicker dtpDay{*this, "dtpDay", "Day"};
   ProgressBar prgBar{*this, "prgBar"};
-  DiskList drvDrives{*this, Kind::Drives, "drvDrives"};
-  DiskList dirFolders{*this, Kind::Folders, "dirFolders"};
-  DiskList filFiles{*this, Kind::Files, "filFiles"};
+  DriveList drvDrives{*this, "drvDrives", Disk()};
+  FolderList dirFolders{*this, "dirFolders", Disk()};
+  FileList filFiles{*this, "filFiles", Disk()};
+
+  [[nodiscard]] FileSystem& Disk() const { return context.channels.Files(); }
 
   void Tell(const std::string& what) { lblTold.SetCaption(lblTold.Caption() + what + ";"); }
   void Box(const std::string& text) {

@@ -118,7 +118,7 @@ Outcome WindowHand::CheckSeen(const Screen& screen) const {
 }
 
 bool WindowHand::TakesSecondClick(const Control& control) const {
-  return control.DoubleClick && windows_.WindowOf(control.InScreen()) != nullptr &&
+  return AnswersDoubleClick(control) && windows_.WindowOf(control.InScreen()) != nullptr &&
          CheckLive(control).Done();
 }
 

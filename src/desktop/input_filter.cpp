@@ -6,6 +6,7 @@
 #include <QApplication>
 #include <QComboBox>
 #include <QDateEdit>
+#include <QLineEdit>
 #include <QMainWindow>
 #include <QMenuBar>
 
@@ -29,6 +30,13 @@ void DropDown(ScreenWindow& window, const Control& menu) {
   auto* const frame = qobject_cast<QMainWindow*>(&window.Window());
   const auto* const view = static_cast<const MenuView*>(window.ViewOf(menu));
   if (frame != nullptr && view != nullptr) frame->menuBar()->setActiveAction(&view->GetAction());
+}
+
+bool CanBeTypedInto(const QWidget& widget) {
+  const auto* const combo = qobject_cast<const QComboBox*>(&widget);
+  return (combo != nullptr && combo->isEditable()) ||
+         qobject_cast<const QLineEdit*>(&widget) != nullptr ||
+         qobject_cast<const QDateEdit*>(&widget) != nullptr;
 }
 
 bool IsMenuMnemonic(const Control& control, char letter) {
@@ -177,6 +185,7 @@ void InputFilter::FinishTyping() {
 bool InputFilter::MousePress(QObject& watched, ScreenWindow& window, const QMouseEvent& event) {
   swallowing_ = false;
   pressed_ = nullptr;
+  clicked_ = nullptr;
   View* const view = window.ViewAt(&watched);
   if (view == nullptr) return false;
   if (!view->Widget()->isEnabled()) return true;
@@ -188,17 +197,22 @@ bool InputFilter::MousePress(QObject& watched, ScreenWindow& window, const QMous
   }
   if (event.button() != Qt::LeftButton) return false;
   pressed_ = &control;
+  clicked_ = &control;
   const auto* const widget = static_cast<const QWidget*>(&watched);
   return view->Pressed(*widget, event);
 }
 
+/// The second press of a double click is no second click, and nothing to what has come up in the
+/// place of what was clicked. In an entry it marks a word.
 bool InputFilter::SecondPress(QObject& watched, ScreenWindow& window, const QMouseEvent& event) {
   View* const view = window.ViewAt(&watched);
-  if (view == nullptr || !AnswersDoubleClick(view->GetControl())) {
+  if (view == nullptr || event.button() != Qt::LeftButton) {
     return MousePress(watched, window, event);
   }
-  if (event.button() != Qt::LeftButton || swallowing_) return true;
-  return view->PressedAgain(static_cast<const QWidget&>(watched), event);
+  const bool was_clicked = clicked_ == &view->GetControl();
+  swallowing_ = !was_clicked || !CanBeTypedInto(*view->Widget());
+  if (was_clicked) view->PressedAgain(static_cast<const QWidget&>(watched), event);
+  return swallowing_;
 }
 
 bool InputFilter::MouseRelease(const QObject& watched, ScreenWindow& window,

@@ -31,6 +31,7 @@ class InputFilter : public QObject {
   Windows& windows_;
   bool swallowing_ = false;  ///< until the button that lost its click is up again
   const Control* pressed_ = nullptr;
+  const Control* clicked_ = nullptr;  ///< by the last press, which may begin a double click
 };
 
 /// The key of the hand that a key of the keyboard is; nothing for any other.

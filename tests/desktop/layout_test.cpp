@@ -5,10 +5,9 @@
 #include <fstream>
 
 #include <QApplication>
-#include <QRegularExpression>
 
-#include "support/club.h"
 #include "tests/desktop/layout_lint.h"
+#include "tests/desktop/window_club.h"
 
 namespace marlowbeck {
 namespace {
@@ -17,13 +16,6 @@ namespace fs = std::filesystem;
 
 constexpr QSize kSmall(800, 600);
 constexpr QSize kWide(1280, 800);
-
-TestFace Windows() {
-  static int argc = 1;
-  static char name[] = "desktop-tests";
-  static char* argv[] = {name, nullptr};
-  return {"windows", [](BoxAnswers& answers) { return MakeWindowFace(answers, argc, argv); }};
-}
 
 std::vector<fs::path> Scripts() {
   std::vector<fs::path> scripts = {MARLOWBECK_SOURCE_DIR "/tools/tour.drive"};
@@ -34,27 +26,9 @@ std::vector<fs::path> Scripts() {
   return scripts;
 }
 
-QWidget* WindowOf(const std::string& screen) {
-  for (QWidget* widget : QApplication::topLevelWidgets()) {
-    const bool is_it = widget->objectName() == QString::fromStdString(screen);
-    if (is_it && widget->isVisible()) return widget;
-  }
-  return nullptr;
-}
-
 /// A script played on a copy of the sample, with a look at the window in front after each line.
 class Layout : public testing::TestWithParam<fs::path> {
  protected:
-  Layout() {
-    club_.today = *DateFromIso("2004-04-07");
-    for (const auto& entry : fs::directory_iterator(MARLOWBECK_SOURCE_DIR "/samples")) {
-      const fs::path name = entry.path().filename();
-      const bool is_data = name.string().starts_with("Winter") || name.extension() == ".qz3";
-      if (is_data) fs::copy_file(entry.path(), club_.FilePath(name.string()));
-    }
-    club_.NameOpenFile("Winter.qza");
-  }
-
   void Play(const std::string& line) {
     if (line.empty() || line.starts_with('#') || line.starts_with("shot")) return;
     club_.Do(line);
@@ -79,7 +53,7 @@ class Layout : public testing::TestWithParam<fs::path> {
     }
   }
 
-  Club club_{{Windows()}};
+  WindowClub club_;
   QStringList told_;
 };
 

@@ -102,12 +102,11 @@ bool ListView::Pressed(const QWidget& on, const QMouseEvent& event) {
 }
 
 /// A second click on a line, where the first has been told already.
-bool ListView::PressedAgain(const QWidget& on, const QMouseEvent& event) {
+void ListView::PressedAgain(const QWidget& on, const QMouseEvent& event) {
   const QModelIndex index =
       &on == list_.viewport() ? list_.indexAt(event.position().toPoint()) : QModelIndex();
   if (!index.isValid()) return CaptionedView::PressedAgain(on, event);
   Do([=, this](Hand& hand) { return hand.SecondPick(model_, index.row()); });
-  return true;
 }
 
 /// Beside the lines.

@@ -13,7 +13,7 @@ class ListView : public CaptionedView {
  public:
   ListView(ListBox& control, QListWidget* list, Windows& windows);
   bool Pressed(const QWidget& on, const QMouseEvent& event) override;
-  bool PressedAgain(const QWidget& on, const QMouseEvent& event) override;
+  void PressedAgain(const QWidget& on, const QMouseEvent& event) override;
   [[nodiscard]] bool ClicksAt(const QWidget& on, QPoint at) const override;
   bool Typed(const QKeyEvent& event) override;
 

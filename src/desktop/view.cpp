@@ -64,9 +64,8 @@ void View::ReadCommon(ControlState& state) const {
 }
 
 bool View::Pressed(const QWidget& /*on*/, const QMouseEvent& /*event*/) { return false; }
-bool View::PressedAgain(const QWidget& /*on*/, const QMouseEvent& /*event*/) {
+void View::PressedAgain(const QWidget& /*on*/, const QMouseEvent& /*event*/) {
   Do([this](Hand& hand) { return hand.SecondClick(control_); });
-  return true;
 }
 bool View::ClicksAt(const QWidget& /*on*/, QPoint /*at*/) const { return false; }
 bool View::Typed(const QKeyEvent& /*event*/) { return false; }

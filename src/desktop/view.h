@@ -35,8 +35,8 @@ class View : public QObject {
 
   /// A press of the left button, once the focus is here. Answers whether it is dealt with.
   virtual bool Pressed(const QWidget& on, const QMouseEvent& event);
-  /// The second press of a double click that means something to the control.
-  virtual bool PressedAgain(const QWidget& on, const QMouseEvent& event);
+  /// The second press of a double click.
+  virtual void PressedAgain(const QWidget& on, const QMouseEvent& event);
   /// A click with the left button there, told when it is let go: that of the control as a whole.
   [[nodiscard]] virtual bool ClicksAt(const QWidget& on, QPoint at) const;
   /// A key that is none of the common ones. Answers whether it is dealt with.

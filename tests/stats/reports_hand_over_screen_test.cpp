@@ -22,7 +22,8 @@ class ReportsHandOver : public ReportsTest {
   void ExpectInFront(const std::string& name, Here here = Here::current()) {
     EXPECT_EQ(Front(here), name);
     EXPECT_TRUE(Loaded("frmPMenu", here));
-    for (const Json& screen : Do("screens", here)["screens"]) {
+    const Json answer = Do("screens", here);
+    for (const Json& screen : answer["screens"]) {
       EXPECT_EQ(screen["visible"], screen["name"] == name) << screen;
     }
   }

@@ -47,6 +47,9 @@ class Channels {
   /// Opens a text file to be written from its beginning. Nothing is on disk until it is closed.
   void OpenOutput(Channel channel, const std::string& path, Keeping keeping);
 
+  /// The path that a file of records was opened by, and the length of its records.
+  [[nodiscard]] std::string Path(Channel channel) { return Random(channel).path; }
+  [[nodiscard]] std::size_t RecordLength(Channel channel) { return Random(channel).record_length; }
   /// Whole records in the file. Throws Overflow above 32767.
   [[nodiscard]] Integer RecordCount(Channel channel);
   /// Fills `into`, one record long, from record `number`, the first being 1.
@@ -66,6 +69,9 @@ class Channels {
   /// Puts these bytes in the place of a file: it holds its old ones until the new ones have reached
   /// the disk. For changes to several records that must not be seen half done.
   void ReplaceWhole(const std::string& path, const std::string& content);
+
+  /// Deletes a work file that is of no more use; that it cannot be is of no matter.
+  void DeleteQuietly(const std::string& path);
 
   [[nodiscard]] SideFileReader& Reader(Channel channel);
   [[nodiscard]] SideFileWriter& Writer(Channel channel);
@@ -96,7 +102,6 @@ class Channels {
   [[nodiscard]] Open& Random(Channel channel);
   [[nodiscard]] static std::uint64_t Position(const Open& open, int number);
   void WriteOut(const Open& open);
-  void DeleteQuietly(const std::string& path);
   static void ReadRun(Open& open, int first, std::span<std::byte> into);
 
   FileSystem& files_;

@@ -30,12 +30,7 @@ class FieldWriter {
   void Day(Date value) {
     WriteUnsigned(record_, Next().offset, std::bit_cast<std::uint64_t>(value.days));
   }
-  void Text(std::string_view value) {
-    const Field& field = Next();
-    for (std::size_t i = 0; i < field.width; ++i) {
-      record_[field.offset + i] = static_cast<std::byte>(i < value.size() ? value[i] : ' ');
-    }
-  }
+  void Text(std::string_view value) { WriteText(record_, Next(), value); }
 
  private:
   const Field& Next() { return fields_[next_++]; }
@@ -71,6 +66,12 @@ class FieldReader {
 std::string_view ReadText(Bytes record, std::size_t offset, std::size_t width) {
   // Bytes may be looked at as characters: this is no cast of a record's layout.
   return {reinterpret_cast<const char*>(record.data()) + offset, width};
+}
+
+void WriteText(std::span<std::byte> record, const Field& field, std::string_view text) {
+  for (std::size_t i = 0; i < field.width; ++i) {
+    record[field.offset + i] = static_cast<std::byte>(i < text.size() ? text[i] : ' ');
+  }
 }
 
 PlayerBytes Encode(const PlayerRecord& record) {

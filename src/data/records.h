@@ -88,6 +88,15 @@ static_assert(FillsRecord(kPlayerFields, kPlayerLength));
 static_assert(FillsRecord(kResultFields, kResultLength));
 static_assert(FillsRecord(kLadderFields, kLadderLength));
 
+/// The field of that name, which must be there.
+template <std::size_t N>
+consteval Field FieldNamed(const std::array<Field, N>& fields, std::string_view name) {
+  for (const Field& field : fields) {
+    if (field.name == name) return field;
+  }
+  throw "there is no such field";
+}
+
 using Bytes = std::span<const std::byte>;
 
 /// Numbers and texts at an offset of a record's bytes.
@@ -109,6 +118,8 @@ template <typename Unsigned>
   return Date{std::bit_cast<double>(ReadUnsigned<std::uint64_t>(record, offset))};
 }
 [[nodiscard]] std::string_view ReadText(Bytes record, std::size_t offset, std::size_t width);
+/// Fills a field with a text, cut or padded to its width.
+void WriteText(std::span<std::byte> record, const Field& field, std::string_view text);
 
 /// One player of one grade. Texts are as the record holds them, padding included, once decoded.
 struct PlayerRecord {

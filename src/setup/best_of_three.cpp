@@ -32,19 +32,12 @@ BestOfThreeChoice ChoiceOf(int code) {
   return choice;
 }
 
-bool StampBestOfThree(std::string& player_file, std::string_view grade, int code) {
-  const std::string_view wanted = Trimmed(grade);
-  const std::span<std::byte> bytes = std::as_writable_bytes(std::span(player_file));
-  bool any = false;
-  for (std::size_t at = 0; at + kPlayerLength <= bytes.size(); at += kPlayerLength) {
-    const auto record = bytes.subspan(at, kPlayerLength);
-    if (PlayerView(record).Grade() != wanted) continue;
-    PlayerRecord player = DecodePlayer(record);
-    player.BestOfThree = code;
-    std::ranges::copy(Encode(player), record.begin());
-    any = true;
-  }
-  return any;
+bool StampBestOfThree(std::span<std::byte> player, std::string_view grade, int code) {
+  if (PlayerView(player).Grade() != Trimmed(grade)) return false;
+  PlayerRecord stamped = DecodePlayer(player);
+  stamped.BestOfThree = code;
+  std::ranges::copy(Encode(stamped), player.begin());
+  return true;
 }
 
 }  // namespace marlowbeck

@@ -1,6 +1,7 @@
 #pragma once
 
-#include <string>
+#include <cstddef>
+#include <span>
 #include <string_view>
 
 namespace marlowbeck {
@@ -27,8 +28,8 @@ struct BestOfThreeChoice {
 /// Nothing chosen for 0 and for a number that is no code.
 [[nodiscard]] BestOfThreeChoice ChoiceOf(int code);
 
-/// Puts the code into every player record of a grade (compared trimmed) in the bytes of a player
-/// file. Answers whether there was any. Bytes behind the last whole record stay as they are.
-bool StampBestOfThree(std::string& player_file, std::string_view grade, int code);
+/// Puts the code into a player record when it is one of a grade (compared trimmed). Answers whether
+/// it is.
+bool StampBestOfThree(std::span<std::byte> player, std::string_view grade, int code);
 
 }  // namespace marlowbeck

@@ -2,6 +2,7 @@
 
 #include <optional>
 
+#include "data/record_rewriting.h"
 #include "data/text.h"
 #include "session/messages.h"
 #include "session/shared_procedures.h"
@@ -95,22 +96,21 @@ void frmNames::cmdCancelBo3_Click() {
   CloseBestOfThree();
 }
 
+/// KEPT: the choice of the games ends an edit, so that a player who is moved into a new grade stays
+/// where he was and is added there as another one; a repair would go on with the edit.
 void frmNames::CloseBestOfThree() {
   cmdAddSave.Enable();
   ShowBestOfThree(false);
-  ButtonsON();
-  txtAddSn.SetFocus();
+  BackToNames();
 }
 
 /// All players of the grade change together or none does.
 void frmNames::ChangeBestOfThree() {
   session_.Grade = Trim(cboAddGrd.Text());
   OpenPlayers();
-  context_.channels.CloseAll();
-  std::string players = context_.channels.ReadWhole(session_.PlayerFile);
-  if (StampBestOfThree(players, session_.Grade, session_.BestOfThree)) {
-    context_.channels.ReplaceWhole(session_.PlayerFile, players);
-  }
+  ChangeRecords(context_.channels, Channel::Players, [this](std::span<std::byte> player) {
+    return StampBestOfThree(player, session_.Grade, session_.BestOfThree);
+  });
 }
 
 }  // namespace marlowbeck

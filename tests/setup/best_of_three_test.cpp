@@ -38,30 +38,21 @@ TEST(BestOfThree, ANumberThatIsNoCodeChoosesNothing) {
   }
 }
 
-TEST(BestOfThree, StampChangesTheCodesOfOneGradeAlone) {
-  std::string file = FileOf({Player(1, "Archer", "Jo", "Rovers", "A Grade", 330),
-                             Player(2, "Dale", "Ed", "Bulls", "B Grade", 111),
-                             Player(3, "Cole", "Di", "Hawks", "A Grade", 0)});
-  EXPECT_TRUE(StampBestOfThree(file, " A Grade ", 3));
-  EXPECT_TRUE(SamePlayers(file, FileOf({Player(1, "Archer", "Jo", "Rovers", "A Grade", 3),
-                                        Player(2, "Dale", "Ed", "Bulls", "B Grade", 111),
-                                        Player(3, "Cole", "Di", "Hawks", "A Grade", 3)})));
-}
-
-TEST(BestOfThree, StampOfAGradeWithoutPlayersChangesNothing) {
-  const std::string before = FileOf({Player(1, "Archer", "Jo", "Rovers", "A Grade", 330)});
-  std::string file = before;
-  EXPECT_FALSE(StampBestOfThree(file, "a grade", 3));
-  EXPECT_EQ(file, before);
+TEST(BestOfThree, StampChangesTheCodeOfAPlayerOfTheGradeAlone) {
+  PlayerBytes player = Encode(Player(3, "Cole", "Di", "Hawks", "A Grade", 0));
+  EXPECT_FALSE(StampBestOfThree(player, "a grade", 3));
+  EXPECT_EQ(player, Encode(Player(3, "Cole", "Di", "Hawks", "A Grade", 0)));
+  EXPECT_TRUE(StampBestOfThree(player, " A Grade ", 3));
+  EXPECT_EQ(player, Encode(Player(3, "Cole", "Di", "Hawks", "A Grade", 3)));
 }
 
 TEST(BestOfThree, StampLeavesEveryOtherByteOfNonsenseAsItIs) {
-  std::string file(2 * kPlayerLength + 100, '\xff');
-  file.replace(94, 20, "A Grade             ");
-  std::string expected = file;
+  std::string player(kPlayerLength, '\xff');
+  player.replace(94, 20, "A Grade             ");
+  std::string expected = player;
   expected.replace(152, 4, std::string("\x4d\x01\0\0", 4));  // 333
-  EXPECT_TRUE(StampBestOfThree(file, "A Grade", 333));
-  EXPECT_EQ(file, expected);
+  EXPECT_TRUE(StampBestOfThree(std::as_writable_bytes(std::span(player)), "A Grade", 333));
+  EXPECT_EQ(player, expected);
 }
 
 }  // namespace

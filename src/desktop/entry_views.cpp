@@ -55,6 +55,13 @@ void ComboView::FocusCame() {
   if (box_.isEditable()) box_.lineEdit()->selectAll();
 }
 
+/// One that is held neither drops down nor goes to another line.
+bool ComboView::Pressed(const QWidget& /*on*/, const QMouseEvent& /*event*/) {
+  return model_.Held();
+}
+
+bool ComboView::Typed(const QKeyEvent& /*event*/) { return model_.Held(); }
+
 void ComboView::ShowEditable() {
   if (box_.isEditable() == !model_.Locked()) return;
   box_.setEditable(!model_.Locked());

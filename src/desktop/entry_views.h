@@ -28,6 +28,8 @@ class ComboView : public CaptionedView {
  public:
   ComboView(ComboBox& control, QComboBox* box, Windows& windows);
   void FocusCame() override;
+  bool Pressed(const QWidget& on, const QMouseEvent& event) override;
+  bool Typed(const QKeyEvent& event) override;
 
  protected:
   void ShowKind() override;

@@ -57,9 +57,13 @@ void frmNames::WirePlayers() {
     txtAddSn.SetFocus();
   };
   lstPlayers.Click = [this] { lstPlayers_Click(); };
+  cmdEdName.Click = [this] { cmdEdName_Click(); };
+  cmdDelName.Click = [this] { cmdDelName_Click(); };
   cmdCancelDel.Click = [this] { cmdCancelDel_Click(); };
   cmdNewGrd.Click = [this] { cmdNewGrd_Click(); };
   cmdNewTm.Click = [this] { cmdNewTm_Click(); };
+  cmdEdGradeName.Click = [this] { cmdEdGradeName_Click(); };
+  cmdEdTeamName.Click = [this] { cmdEdTeamName_Click(); };
   cmdEdBOT.Click = [this] { cmdEdBOT_Click(); };
   grade_boxes.Changed = [this] { NewGradePegs(); };
   cmdNoPOK.Click = [this] { cmdNoPOK_Click(); };
@@ -95,6 +99,17 @@ void frmNames::Unload() { InScreens().Show("frmDB"); }
 
 void frmNames::OpenPlayers() { OpenFile(session_, context_.channels); }
 
+/// Takes the grade from its combo, as it stands there.
+void frmNames::NameFilesOfGrade() {
+  session_.Grade = Trim(cboAddGrd.Text());
+  NameGradeFiles(session_);
+}
+
+void frmNames::OpenResultSFile() {
+  NameFilesOfGrade();
+  marlowbeck::OpenResultSFile(session_, context_.channels);
+}
+
 void frmNames::Reset() {
   OpenPlayers();
   if (session_.PlayerCount < 1) {
@@ -120,8 +135,7 @@ void frmNames::ResetToLists() {
   cmdClear.Hide();
   panAddPlayer0.Hide();
   panAddPlayer.Show();
-  panAddPlayer.Enable();
-  panAddPlayer.SetCaption(" Setup :    Teams, Grades and Players ");
+  EnablePanel(kSetupCaption);
   fraAddNames.SetCaption("Add New Players");
   fraNamesMenu.Hide();
   ShowBestOfThree(false);
@@ -167,9 +181,33 @@ void frmNames::ButtonsON() {
   session_.EditRecord = 0;
 }
 
-void frmNames::FreeCombos() {
-  cboAddGrd.SetLocked(false);
-  cboAddTm.SetLocked(false);
+/// The commands come back also when the work fails, since they alone lead on.
+void frmNames::WithButtonsOff(const Handler& work) {
+  ButtonsOFF();
+  try {
+    work();
+  } catch (const RunTimeError&) {
+    context_.channels.AbandonAll();
+    ButtonsON();
+    throw;
+  }
+}
+
+void frmNames::BackToNames() {
+  ButtonsON();
+  txtAddSn.SetFocus();
+}
+
+void frmNames::HoldCombos(bool held) {
+  cboAddGrd.SetHeld(held);
+  cboAddTm.SetHeld(held);
+}
+
+void frmNames::FreeCombos() { HoldCombos(false); }
+
+void frmNames::EnablePanel(const char* caption) {
+  panAddPlayer.Enable();
+  panAddPlayer.SetCaption(caption);
 }
 
 void frmNames::ClearNames() {

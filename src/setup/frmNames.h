@@ -4,6 +4,7 @@
 #include <vector>
 
 #include "setup/best_of_three_boxes.h"
+#include "setup/player_names.h"
 #include "ui/context.h"
 #include "ui/controls.h"
 #include "ui/screen.h"
@@ -97,6 +98,12 @@ struct frmNames : Screen {
   bool SaveNewPlayer0();
   void cmdAddSave_Click();
   bool SaveNewPlayer();
+  void cmdEdName_Click();
+  void cmdDelName_Click();
+
+  // Other names for grades and teams.
+  void cmdEdGradeName_Click();
+  void cmdEdTeamName_Click();
 
   // Best of Three.
   void CheckNoP();
@@ -109,6 +116,8 @@ struct frmNames : Screen {
   void cmdCancelBo3_Click();
 
  private:
+  static constexpr const char* kSetupCaption = " Setup :    Teams, Grades and Players ";
+
   /// Whether a name is in use already, looked for in the open player file.
   using InUse = bool (*)(Channels& channels, std::string_view name);
 
@@ -119,12 +128,18 @@ struct frmNames : Screen {
   void ResetToLists();
   void ShowBestOfThree(bool shown);
   void EnableButtons(bool enabled);
+  void WithButtonsOff(const Handler& work);
+  void BackToNames();
+  void HoldCombos(bool held);
   void FreeCombos();
+  void EnablePanel(const char* caption);
   void ClearNames();
   void NamesChanged();
   void PutGradeAndTeamBack(const std::string& grade, const std::string& team);
 
+  void NameFilesOfGrade();
   void OpenPlayers();
+  void OpenResultSFile();
   void AskForNewName(const std::string& prompt, const std::string& title, InUse in_use,
                      ComboBox& combo);
   void AddNewName(const std::string& name, InUse in_use, ComboBox& combo);
@@ -133,6 +148,21 @@ struct frmNames : Screen {
   void PutPlayer();
   void PutEdited(const PlayerRecord& player);
   void Append(const PlayerRecord& player);
+
+  [[nodiscard]] ListedLine PickedLine() const;
+  void TakeUp(const ListedPlayer& player);
+  void LockPlayerWithResults();
+  void FindDoomed();
+  [[nodiscard]] int CountResults();
+  void DeletePlayer(int results);
+  void BackFromDeletion();
+
+  void TakeGradeAndTeam();
+  [[nodiscard]] std::string AskForOtherName(const std::string& title, const std::string& name);
+  [[nodiscard]] bool IsFree(std::string_view name, InUse in_use);
+  void RenameGrade(const std::string& name);
+  void RenameFilesOfGrade(const std::string& name);
+  void RenameTeam(const std::string& name);
 
   bool FindBestOfThree();
   void RefuseBestOfThree();

@@ -79,8 +79,7 @@ void frmNames::lstPlayers_Click() {
 void frmNames::cmdCancelDel_Click() {
   session_.Flag = 0;
   fraNamesMenu.Hide();
-  panAddPlayer.Enable();
-  panAddPlayer.SetCaption(" Setup :    Teams, Grades and Players ");
+  EnablePanel(kSetupCaption);
   FreeCombos();
   ButtonsON();
   PlayerList();
@@ -110,17 +109,11 @@ void frmNames::cmdNewTm_Click() {
 /// A new name stands in its list only: it is written with the first player who carries it.
 void frmNames::AskForNewName(const std::string& prompt, const std::string& title, InUse in_use,
                              ComboBox& combo) {
-  ButtonsOFF();
-  const std::string reply = context_.platform.boxes.Input({prompt, title, {}, {}});
-  try {
+  WithButtonsOff([&] {
+    const std::string reply = context_.platform.boxes.Input({prompt, title, {}, {}});
     if (!Trimmed(reply).empty()) AddNewName(reply, in_use, combo);
-  } catch (const RunTimeError&) {
-    context_.channels.AbandonAll();
-    ButtonsON();
-    throw;
-  }
-  ButtonsON();
-  txtAddSn.SetFocus();
+    BackToNames();
+  });
 }
 
 void frmNames::AddNewName(const std::string& name, InUse in_use, ComboBox& combo) {

@@ -82,7 +82,7 @@ void frmNames::NamesChanged() {
 
 void frmNames::cmdAddSave_Click() {
   if (!SaveNewPlayer()) return;
-  panAddPlayer.SetCaption(" Setup :    Teams, Grades and Players ");
+  panAddPlayer.SetCaption(kSetupCaption);
   FreeCombos();
   // KEPT: a saved player sounds twice, here and when the record is written; a repair would leave
   // this one out.
@@ -130,6 +130,9 @@ void frmNames::PutEdited(const PlayerRecord& player) {
   edited.ID = session_.Flag;
   context_.channels.Put(Channel::Players, session_.EditRecord, Encode(edited));
   context_.channels.CloseAll();
+  // The player is saved: what is typed from here on is another one, whatever becomes of the lists.
+  session_.EditRecord = 0;
+  session_.Flag = 0;
   ClearNames();
   cmdClear.Hide();
   OKSound(context_);

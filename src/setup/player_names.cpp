@@ -30,6 +30,27 @@ bool InUse(Channels& channels, NameOf name, std::string_view wanted) {
   return found;
 }
 
+constexpr std::string_view kBetweenNames = ", ";
+
+bool IsOf(const PlayerView& player, std::string_view team, std::string_view grade) {
+  return player.Team() == Trimmed(team) && player.Grade() == Trimmed(grade);
+}
+
+enum class AfterAMatch { Stop, GoOn };
+
+/// The last match that is met.
+std::optional<ListedPlayer> Listed(Channels& channels, const ListedLine& at, AfterAMatch after) {
+  std::optional<ListedPlayer> found;
+  channels.ForEachRecord(Channel::Players, [&](Bytes bytes, int number) {
+    const PlayerView player(bytes);
+    if (!IsOf(player, at.team, at.grade) || player.FullName(kBetweenNames) != at.line) return true;
+    found = {number, Integer::Narrow(player.ID()), std::string(player.Surname()),
+             std::string(player.FirstName())};
+    return after == AfterAMatch::GoOn;
+  });
+  return found;
+}
+
 }  // namespace
 
 std::vector<std::string> AllGrades(Channels& channels) {
@@ -45,11 +66,17 @@ std::vector<std::string> PlayersOf(Channels& channels, std::string_view team,
   std::vector<std::string> players;
   channels.ForEachRecord(Channel::Players, [&](Bytes bytes, int) {
     const PlayerView player(bytes);
-    if (player.Team() == Trimmed(team) && player.Grade() == Trimmed(grade)) {
-      players.push_back(player.FullName(", "));
-    }
+    if (IsOf(player, team, grade)) players.push_back(player.FullName(kBetweenNames));
   });
   return players;
+}
+
+std::optional<ListedPlayer> LastListed(Channels& channels, const ListedLine& at) {
+  return Listed(channels, at, AfterAMatch::GoOn);
+}
+
+std::optional<ListedPlayer> FirstListed(Channels& channels, const ListedLine& at) {
+  return Listed(channels, at, AfterAMatch::Stop);
 }
 
 bool GradeInUse(Channels& channels, std::string_view grade) {

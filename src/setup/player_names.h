@@ -22,6 +22,35 @@ namespace marlowbeck {
 [[nodiscard]] std::vector<std::string> PlayersOf(Channels& channels, std::string_view team,
                                                  std::string_view grade);
 
+/// A player found by the line of the list.
+struct ListedPlayer {
+  Integer record;
+  Integer id;
+  std::string surname;
+  std::string first_name;
+};
+
+/// Where a line of the list stands: among the players of a team in a grade.
+struct ListedLine {
+  std::string_view team;
+  std::string_view grade;
+  std::string_view line;
+};
+
+// Both throw Overflow where a player is met whose id is above 32767.
+//
+// KEPT: an id is handed over as a number of 16 bits, so that players above 32767 can be neither
+// edited nor deleted; a repair would hand over 32 bits.
+
+/// The player to be edited.
+///
+/// KEPT: of players with the same line the last one is edited; a repair would ask which is meant.
+[[nodiscard]] std::optional<ListedPlayer> LastListed(Channels& channels, const ListedLine& at);
+/// The player to be deleted.
+///
+/// KEPT: of players with the same line the first one is deleted; a repair would ask which is meant.
+[[nodiscard]] std::optional<ListedPlayer> FirstListed(Channels& channels, const ListedLine& at);
+
 /// Whether a player has this grade, in any case.
 [[nodiscard]] bool GradeInUse(Channels& channels, std::string_view grade);
 /// Whether a player of any grade has this team, in any case.

@@ -169,8 +169,8 @@ class ListBox : public LineHolder {
   std::set<int> marked_;
 };
 
-/// A list that drops down. A locked one can be picked from only; by program its text may be
-/// anything all the same.
+/// A list that drops down. A locked one cannot be typed into, only picked from; one that is held
+/// cannot be picked from either. By program its text may be anything all the same.
 class ComboBox : public LineHolder {
  public:
   enum class Typing { Locked, Free };
@@ -184,8 +184,9 @@ class ComboBox : public LineHolder {
   /// Click.
   void SetText(std::string_view text);
   [[nodiscard]] bool Locked() const { return typing_ == Typing::Locked || held_; }
-  /// Locks a combo that can be typed into, or frees it again.
-  void SetLocked(bool locked) { Assign(held_, locked); }
+  /// Its text is not to be changed by a person, in no way.
+  [[nodiscard]] bool Held() const { return held_; }
+  void SetHeld(bool held) { Assign(held_, held); }
 
   void RemoveLine(int index) override;
   void Clear() override;

@@ -43,6 +43,11 @@ bool HasEntries(const Control& menu) {
                      [&](const Control* entry) { return entry->InControl() == &menu; });
 }
 
+bool IsHeld(Control& control) {
+  const auto* combo = As<ComboBox>(control);
+  return combo != nullptr && combo->Held();
+}
+
 bool CanBeTypedInto(Control& control) {
   if (const auto* box = As<TextBox>(control)) return !box->Locked();
   if (const auto* combo = As<ComboBox>(control)) return !combo->Locked();
@@ -167,6 +172,7 @@ Outcome Hand::Pick(Control& control, int line) {
   if (const Outcome check = CheckLive(control); !check.Done()) return check;
   auto* const list = As<LineHolder>(control);
   if (list == nullptr) return Refused(control, "has no lines");
+  if (IsHeld(control)) return Refused(control, "is locked");
   if (line < 0 || line >= list->Count()) return Refused(control, "has no such line");
   return Act(control, [=] {
     if (line < list->Count()) PickLine(*list, line);
@@ -378,7 +384,7 @@ void Hand::MoveLine(LineHolder& list, int step) {
 }
 
 void Hand::GoToLine(LineHolder& list, int line) {
-  if (list.Count() == 0) return;
+  if (list.Count() == 0 || IsHeld(list)) return;
   const int target = std::clamp(line, 0, list.Count() - 1);
   if (auto* box = As<ListBox>(list); box != nullptr && box->PicksOnEnter()) {
     box->SetCursor(target);

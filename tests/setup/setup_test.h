@@ -4,6 +4,7 @@
 #include <vector>
 
 #include "support/club.h"
+#include "support/league.h"
 #include "support/record_files.h"
 
 namespace marlowbeck {
@@ -40,6 +41,18 @@ class SetupTest : public ClubTest {
 
   [[nodiscard]] std::vector<PlayerRecord> Saved() const { return Players(kPlayerFile); }
 };
+
+/// A match as the ladder holds it.
+inline LadderRecord Match(std::string_view home, std::string_view away, int home_score = 7,
+                          int away_score = 4) {
+  LadderRecord match;
+  match.HomeTeam = home;
+  match.AwayTeam = away;
+  match.HomeScore = static_cast<std::int16_t>(home_score);
+  match.AwayScore = static_cast<std::int16_t>(away_score);
+  match.GameDate = March(31);
+  return match;
+}
 
 /// Two grades of two teams, the way a club has them after its first evening.
 inline std::vector<PlayerRecord> TwoGrades() {

@@ -113,6 +113,23 @@ TEST_F(HandTest, WhatNobodyCouldDoIsRefusedAndChangesNothing) {
   EXPECT_EQ(a.Focus(), nullptr) << "nothing on a disabled screen has it";
 }
 
+TEST_F(HandTest, AComboThatIsHeldIsChangedInNoWay) {
+  for (const char* team : {"Hawks", "Rovers"}) a.cboFree.AddLine(team);
+  a.cboFree.SetText("Hawks");
+  log.clear();
+  a.cboFree.SetHeld(true);
+  EXPECT_TRUE(a.cboFree.Locked());
+  EXPECT_FALSE(hand.Type(a.cboFree, "x").Done());
+  EXPECT_EQ(hand.Pick(a.cboFree, 1).refusal, "cboFree is locked");
+  EXPECT_TRUE(hand.Focus(a.cboFree).Done());
+  hand.Press(Key::Down);
+  hand.MoveToLine(a.cboFree, 1);
+  EXPECT_EQ(a.cboFree.Text(), "Hawks");
+  a.cboFree.SetHeld(false);
+  hand.Press(Key::Down);
+  EXPECT_EQ(a.cboFree.Text(), "Rovers");
+}
+
 TEST_F(HandTest, ALabelAndAPanelWithAClickOfTheirOwnTakeOne) {
   a.lblA.Click = [this] { log.push_back("label"); };
   a.fraA.Click = [this] { log.push_back("panel"); };

@@ -104,6 +104,9 @@ Outcome WindowHand::Pick(Control& control, int line) {
 
 /// Drops the list down and clicks on the line, if leaving what had the focus has left it there.
 Outcome WindowHand::PickInCombo(View& view, int line) {
+  if (static_cast<const ComboBox&>(view.GetControl()).Held()) {
+    return Refused(view.GetControl(), "is locked");
+  }
   auto& combo = static_cast<QComboBox&>(*view.Widget());
   if (!Reach(view)) return OutOfReach(view.GetControl());
   ClickMouse(combo, ArrowOf(combo));

@@ -60,6 +60,16 @@ ResultRecord Result(int index, int night) {
   return result;
 }
 
+LadderRecord Match(int index) {
+  LadderRecord match;
+  match.HomeTeam = TeamName(index);
+  match.AwayTeam = TeamName(index ^ 1);
+  match.HomeScore = static_cast<std::int16_t>(index % 12);
+  match.AwayScore = static_cast<std::int16_t>(11 - index % 12);
+  match.GameDate = Season::GameDate(index * kDates / kMatches);
+  return match;
+}
+
 template <typename Encoded>
 void Append(std::vector<std::byte>& bytes, const Encoded& record) {
   bytes.insert(bytes.end(), record.begin(), record.end());
@@ -91,6 +101,10 @@ Season::Season(Entry entry) : folder_(NewFolder()) {
     Append(results, Encode(Result(index, night)));
   }
   WriteFile(ResultsFile(), results);
+
+  std::vector<std::byte> matches;
+  for (int index = 0; index < kMatches; ++index) Append(matches, Encode(Match(index)));
+  WriteFile(LadderFile(), matches);
 }
 
 Season::~Season() {

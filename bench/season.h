@@ -16,12 +16,14 @@ enum class Entry {
 
 inline constexpr int kPlayers = 999;
 inline constexpr int kResults = 32767;
+inline constexpr int kMatches = 32767;
 inline constexpr int kDates = 40;  ///< weekly, from 7 January 2004
 inline constexpr int kTeams = 50;  ///< "Team 01" to "Team 50", player n in team (n - 1) % 50 + 1
 inline constexpr const char* kGrade = "A Grade";
 
 /// A competition at the limits of the system, in a temporary folder that goes with it: 999 players
-/// of one grade with ids from 1 on, 32767 results on 40 dates, one in a hundred of them a forfeit.
+/// of one grade with ids from 1 on, 32767 results on 40 dates, one in a hundred of them a forfeit,
+/// 32767 matches on the same dates.
 class Season {
  public:
   explicit Season(Entry entry = Entry::NightByNight);
@@ -34,6 +36,7 @@ class Season {
   [[nodiscard]] std::string ResultsFile() const {
     return (folder_ / "Limits_A Grade.qzr").string();
   }
+  [[nodiscard]] std::string LadderFile() const { return (folder_ / "Limits_A Grade.qzl").string(); }
 
   /// A session with the competition open and its grade in hand.
   [[nodiscard]] Session OpenSession() const;

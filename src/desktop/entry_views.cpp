@@ -1,6 +1,7 @@
 #include "desktop/entry_views.h"
 
 #include <QAbstractItemView>
+#include <QApplication>
 
 #include "data/runtime_error.h"
 #include "desktop/encoding.h"
@@ -34,8 +35,20 @@ bool TextView::ClicksAt(const QWidget& /*on*/, QPoint /*at*/) const {
 }
 
 void TextView::ShowKind() {
-  box_.setReadOnly(model_.Locked());
+  if (box_.isReadOnly() != model_.Locked()) ShowLocked();
   if (FromQt(box_.text()) != model_.Text()) box_.setText(ToQt(model_.Text()));
+}
+
+/// White is for what can be typed into.
+void TextView::ShowLocked() {
+  box_.setReadOnly(model_.Locked());
+  QPalette palette = box_.palette();
+  for (const auto group : {QPalette::Active, QPalette::Inactive}) {
+    palette.setColor(
+        group, QPalette::Base,
+        QApplication::palette().color(model_.Locked() ? QPalette::Window : QPalette::Base));
+  }
+  box_.setPalette(palette);
 }
 
 void TextView::ReadKind(ControlState& state) const {

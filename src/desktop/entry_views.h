@@ -20,6 +20,8 @@ class TextView : public CaptionedView {
   void ReadKind(ControlState& state) const override;
 
  private:
+  void ShowLocked();
+
   TextBox& model_;
   QLineEdit& box_;
 };

@@ -2,6 +2,8 @@
 
 #include <memory>
 
+#include "results/frmChangeDate.h"
+#include "results/frmEdScore.h"
 #include "results/frmResults.h"
 #include "session/frmAbout.h"
 #include "session/frmBuend.h"
@@ -32,6 +34,8 @@ void RegisterScreens(Screens& screens, const Context& context) {
   Register<frmGameNames>(screens, "frmGameNames", context);
   Register<frmSeason>(screens, "frmSeason", context);
   Register<frmResults>(screens, "frmResults", context);
+  Register<frmEdScore>(screens, "frmEdScore", context);
+  Register<frmChangeDate>(screens, "frmChangeDate", context);
   Register<frmPMenu>(screens, "frmPMenu", context);
   Register<frmErrors>(screens, "frmErrors", context);
 }

@@ -4,6 +4,7 @@
 #include "data/competition.h"
 #include "data/numbers.h"
 #include "data/text.h"
+#include "results/find_records.h"
 #include "results/frmResults.h"
 #include "results/player_listing.h"
 #include "results/quiet_spell.h"
@@ -47,19 +48,10 @@ void frmResults::GotPlayer() {
 /// Shows the sheet of the first player whose name is the selected line; false when there is none.
 bool frmResults::FindPlayer(const ListBox& list) {
   if (list.Index() < 0) return false;
-  const Session& session = context_.session;
-  const std::string& line = list.Line(list.Index());
-  bool found = false;
-  OpenFile(context_.session, context_.channels);
-  context_.channels.ForEachRecord(Channel::Players, [&](Bytes bytes, int) {
-    const PlayerView player(bytes);
-    found = player.FullName(kSheetNameSeparator) == line && player.Grade() == session.Grade &&
-            player.Team() == session.Team;
-    if (found) ShowPlayer(DecodePlayer(bytes));
-    return !found;
-  });
-  context_.channels.CloseAll();
-  return found;
+  const auto player = FindPlayerByLine(context_.session, context_.channels, list.Line(list.Index()),
+                                       kSheetNameSeparator);
+  if (player) ShowPlayer(*player);
+  return player.has_value();
 }
 
 void frmResults::ShowPlayer(const PlayerRecord& player) {
@@ -105,15 +97,12 @@ void frmResults::CloseSheet() {
 /// record buffer; 0 for none.
 int frmResults::FindSavedResult() {
   const Session& session = context_.session;
-  const auto id = static_cast<std::int32_t>(Val(panPlrID.Caption()));
-  const std::string opposition = Trim(cboOpp.Text());
+  const ResultKey wanted{static_cast<std::int32_t>(Val(panPlrID.Caption())), session.Team,
+                         Trim(cboOpp.Text()), session.WorkDate};
   int found = 0;
   OpenResultSFile(context_.session, context_.channels);
   ForEachResult([&](const ResultView& result, int number) {
-    if (result.GameDate() == session.WorkDate && result.ID() == id &&
-        result.Team() == session.Team && result.Opposition() == opposition) {
-      found = number;
-    }
+    if (wanted.Fits(result)) found = number;
     return true;
   });
   if (found > 0) ReadRecord(found);

@@ -151,6 +151,18 @@ void frmPMenu::OpenReport(int choice, std::string_view screen) {
   GoTo(screen);
 }
 
+void frmPMenu::OpenDialog(std::string_view screen, const Handler& saved) {
+  Screen* const dialog = InScreens().Load(screen);
+  if (dialog == nullptr) return;
+  dialog->Saved = saved;
+  dialog->Closed = [this] {
+    SetEnabled(true);
+    InScreens().Show(Name());
+  };
+  SetEnabled(false);
+  GoTo(screen);
+}
+
 void frmPMenu::GoTo(std::string_view screen) {
   if (!InScreens().Knows(screen)) return;
   InScreens().Hide(*this);

@@ -121,6 +121,9 @@ struct frmPMenu : Screen {
   void OpenReport(int choice, std::string_view screen);
   /// Hides this screen and shows another, where there is such a screen.
   void GoTo(std::string_view screen);
+  /// The same for one that comes back here: this screen is out of reach until then, and `saved`
+  /// runs each time that the other one has saved something.
+  void OpenDialog(std::string_view screen, const Handler& saved);
 
   const Context& context_;
   Session& session_;

@@ -155,7 +155,10 @@ void frmPMenu::cmdChangeDate_Click() {
   context_.GoToWorkingFolder();
   WriteWorkDate(context_.channels, session_.WorkDate);
   WriteOneString(context_.channels, "dc.qz3", session_.Team);
-  GoTo("frmChangeDate");
+  OpenDialog("frmChangeDate", [this] {
+    GetDates();
+    ListDates();
+  });
 }
 
 void frmPMenu::grdWeek_DoubleClick() {
@@ -169,7 +172,7 @@ void frmPMenu::grdWeek_DoubleClick() {
     context_.channels.Writer(Channel::Side).Text(item).EndLine();
   }
   context_.channels.CloseAll();
-  GoTo("frmEdScore");
+  OpenDialog("frmEdScore", [this] { FillGrids(); });
 }
 
 }  // namespace marlowbeck

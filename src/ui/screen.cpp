@@ -69,6 +69,10 @@ Control* Screen::NextStop(bool backward) const {
   return nullptr;
 }
 
+void Screen::TellSaved() {
+  if (Saved) screens_.GetDispatcher().Run(Saved);
+}
+
 void Screen::CloseButton() { screens_.Unload(*this); }
 void Screen::Escape() { ClickFirstLive(Cancels); }
 void Screen::HelpKey() { ClickFirstLive(Helps); }

@@ -49,6 +49,9 @@ class Screen {
   virtual void Activate() {}  ///< shown, or in front again since another was hidden or unloaded
   virtual void Unload() {}    ///< it has left; by now it is out of sight
 
+  /// Tells the opener that something of its concern has been saved.
+  void TellSaved();
+
   // What a person does to the screen as a whole.
   virtual void CloseButton();  ///< by default unloads the screen
   virtual void Escape();       ///< by default clicks the first live of Cancels
@@ -60,9 +63,10 @@ class Screen {
   std::vector<Control*> Cancels;
   std::vector<Control*> Helps;
 
-  // What a screen has to tell the one that opened it.
-  Handler Saved;
-  Handler Closed;
+  // What a screen has to tell the one that opened it. Each runs as an event of its own, so that
+  // what the opener makes of it undoes nothing here.
+  Handler Saved;   ///< by TellSaved
+  Handler Closed;  ///< it has left
 
  private:
   friend class Control;

@@ -259,7 +259,7 @@ TEST_F(WeeklyReport, ADoubleClickOnANameHandsTheScoreOver) {
   Do("dblcell grdWeek 1 0");
   EXPECT_EQ(File("qzEdScor.qz3"),
             "\"A\"\r\n\"Rovers\"\r\n\"Swifts\"\r\n\"24/03/2004\"\r\n\"Archer, Jo\"\r\n");
-  EXPECT_EQ(Front(), "frmPMenu");
+  EXPECT_EQ(Front(), "frmEdScore");
 }
 
 TEST_F(WeeklyReport, ADoubleClickElsewhereDoesNothing) {
@@ -277,7 +277,7 @@ TEST_F(WeeklyReport, ChangeGameDateHandsDateAndTeamOver) {
   Do("click cmdChangeDate");
   EXPECT_EQ(File("WkDate.qz3"), "#2004-03-17#\r\n");
   EXPECT_EQ(File("dc.qz3"), "\"Rovers\"\r\n");
-  EXPECT_EQ(Front(), "frmPMenu");
+  EXPECT_EQ(Front(), "frmChangeDate");
 }
 
 TEST_F(WeeklyReport, HelpOpensItsTopic) {

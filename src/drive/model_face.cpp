@@ -67,7 +67,7 @@ Outcome ModelFace::Perform(const Action& action) {
     case Verb::Press:
       return hand.Strike(action.key);
     case Verb::Mnemonic:
-      return hand.PressMnemonic(action.letter);
+      return hand.StrikeMnemonic(action.letter);
     case Verb::Focus:
       return hand.Focus(*action.control);
     case Verb::Hover:

@@ -322,11 +322,20 @@ Outcome Hand::Release() {
   return {};
 }
 
-Outcome Hand::Strike(Key key) {
+Outcome Hand::Struck(const std::function<Outcome()>& press) {
   const long boxes_before = boxes_.Shown();
-  Outcome outcome = Press(key);
-  if (outcome.Done() && boxes_.Shown() == boxes_before) Release();
+  Outcome outcome = press();
+  const bool comes_up_here = boxes_.Shown() == boxes_before && open_menu_ == nullptr;
+  if (outcome.Done() && comes_up_here) Release();
   return outcome;
+}
+
+Outcome Hand::Strike(Key key) {
+  return Struck([&] { return Press(key); });
+}
+
+Outcome Hand::StrikeMnemonic(char letter) {
+  return Struck([&] { return PressMnemonic(letter); });
 }
 
 void Hand::PressOn(Control* focus, Screen& front, Key key) {

@@ -57,10 +57,12 @@ class Hand {
   Outcome Press(Key key);
   /// A key comes up, in whatever has the focus by then.
   Outcome Release();
-  /// A key goes down and comes up again. One that called up a box comes up in that.
+  /// A key goes down and comes up again. One that called up a box or a menu comes up in that.
   Outcome Strike(Key key);
   /// The mnemonic of a letter: the command with it, or a menu, and then an entry of that menu.
   Outcome PressMnemonic(char letter);
+  /// The letter goes down and comes up again.
+  Outcome StrikeMnemonic(char letter);
   /// The menu that was dropped down has gone again.
   void CloseMenu() { open_menu_ = nullptr; }
   Outcome Focus(Control& control);
@@ -71,6 +73,7 @@ class Hand {
  private:
   Outcome Act(Control& control, const Handler& action);
   Outcome Whole(const Handler& action);
+  Outcome Struck(const std::function<Outcome()>& press);
   Outcome DropDown(Control& menu);
   Outcome Twice(Control& control, const std::function<Outcome()>& click);
   bool TakeFocus(Control& control);

@@ -306,6 +306,22 @@ TEST_F(Acting, KeysGoToTheControlWithTheFocus) {
   EXPECT_EQ(Index("lstOne"), 0);
 }
 
+TEST_F(Acting, AKeyComesUpInTheListThatHasTheFocusByThen) {
+  Change([](Workbench& bench) {
+    bench.lstOne.SetCaption("O&ne");
+    bench.lstOne.KeyUp = [&bench] { bench.Tell("key up"); };
+  });
+  EXPECT_EQ(ToldBy("key Alt+N"), "key up;");
+  EXPECT_EQ(ToldBy("key Down"), "lstOne clicked;key up;");
+  EXPECT_EQ(ToldBy("key F1"), "cmdHelp clicked;key up;");
+  EXPECT_EQ(ToldBy("key Alt+F"), "") << "it comes up in the menu";
+  EXPECT_EQ(ToldBy("key Alt+O"), "mnuOpen clicked;key up;");
+  const std::string before = Caption("lblTold");
+  Refused("key Alt+Q");
+  EXPECT_EQ(Caption("lblTold"), before);
+  EXPECT_EQ(ToldBy("key Tab"), "");
+}
+
 TEST_F(Acting, MnemonicsGoByTheirLetter) {
   EXPECT_EQ(ToldBy("key Alt+D"), "cmdDo clicked;");
   EXPECT_EQ(ToldBy("key Alt+d"), "cmdDo clicked;");

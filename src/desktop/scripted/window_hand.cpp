@@ -1,5 +1,6 @@
 #include "desktop/scripted/window_hand.h"
 
+#include <algorithm>
 #include <array>
 #include <stdexcept>
 
@@ -207,19 +208,25 @@ Outcome WindowHand::Press(Key key) {
                                                                 {Key::Up, Qt::Key_Up},
                                                                 {Key::Down, Qt::Key_Down},
                                                                 {Key::F1, Qt::Key_F1}}};
+  const auto* const place = std::find_if(kKeys.begin(), kKeys.end(),
+                                         [key](const auto& known) { return known.first == key; });
   CloseDropped();
-  for (const auto& [known, code] : kKeys) {
-    if (known == key) Strike(*front, code);
-  }
-  return Taken();
+  return Strike(KeyboardOf(*front), place->second, Qt::NoModifier);
 }
 
-/// A key comes up where the focus is by then. One that called up a box comes up in that.
-void WindowHand::Strike(const ScreenWindow& front, int code) {
+/// A key comes up where the focus is by then. One that called up a box or a menu comes up in that.
+Outcome WindowHand::Strike(QWidget& keyboard, int code, Qt::KeyboardModifiers modifiers,
+                           const QString& text) {
   const long boxes_before = boxes_.Shown();
-  KeyDown(KeyboardOf(front), code);
-  const ScreenWindow* const now = windows_.Front();
-  if (now != nullptr && boxes_.Shown() == boxes_before) KeyUp(KeyboardOf(*now), code);
+  KeyDown(keyboard, code, modifiers, text);
+  Outcome outcome = Taken();
+  const ScreenWindow* const front = windows_.Front();
+  const bool comes_up_here =
+      boxes_.Shown() == boxes_before && QApplication::activePopupWidget() == nullptr;
+  if (!outcome.Done() || !comes_up_here || front == nullptr) return outcome;
+  KeyUp(KeyboardOf(*front), code, modifiers, text);
+  Taken();
+  return outcome;
 }
 
 /// While a menu is down, a letter of one of its entries is the menu's.
@@ -231,13 +238,11 @@ Outcome WindowHand::PressMnemonic(char letter) {
     for (const QAction* entry : menu->actions()) {
       if (MnemonicOf(FromMnemonicText(entry->text())) != static_cast<char>(key)) continue;
       if (!entry->isEnabled() || !entry->isVisible()) continue;
-      PressKey(*menu, key, Qt::NoModifier, QChar(key).toLower());
-      return Taken();
+      return Strike(*menu, key, Qt::NoModifier, QChar(key).toLower());
     }
   }
   CloseDropped();
-  PressKey(KeyboardOf(*front), key, Qt::AltModifier);
-  return Taken();
+  return Strike(KeyboardOf(*front), key, Qt::AltModifier);
 }
 
 /// By a press of the button that is let go elsewhere.

@@ -37,7 +37,8 @@ class WindowHand {
   Outcome CellTwice(Control& control, int row, int col);
   Outcome PickDate(Control& control, Date date);
   Outcome Press(Key key);
-  void Strike(const ScreenWindow& front, int code);
+  Outcome Strike(QWidget& keyboard, int code, Qt::KeyboardModifiers modifiers,
+                 const QString& text = {});
   Outcome PressMnemonic(char letter);
   Outcome Focus(Control& control);
   Outcome Hover(Control& control);

@@ -1,5 +1,7 @@
 #include "desktop/caption_views.h"
 
+#include <algorithm>
+
 #include <QMenu>
 
 #include "data/text.h"
@@ -21,6 +23,25 @@ void MoveBeside(QWidget& picture, const Control& control) {
   const QPoint centre = other->mapTo(picture.window(), other->rect().center());
   const int height = picture.parentWidget()->mapFrom(picture.window(), centre).y();
   picture.move(picture.x(), height - picture.height() / 2);
+}
+
+/// What holds a panel comes up with it.
+void RaiseWithHolders(QWidget& panel) {
+  for (QWidget* widget = &panel; widget != panel.window(); widget = widget->parentWidget()) {
+    widget->raise();
+  }
+}
+
+/// What holds nothing any more that could be seen is not to lie over anything.
+void LowerEmptyHolders(const QWidget& panel) {
+  for (QWidget* holder = panel.parentWidget(); holder != panel.window();
+       holder = holder->parentWidget()) {
+    const auto inner = holder->findChildren<QWidget*>(Qt::FindDirectChildrenOnly);
+    const bool is_empty = std::all_of(inner.begin(), inner.end(),
+                                      [](const QWidget* widget) { return widget->isHidden(); });
+    if (!is_empty) return;
+    holder->lower();
+  }
 }
 
 /// A name may be filled up with blanks to the width of its field.
@@ -57,9 +78,10 @@ void PanelView::ShowKind() {
 
 /// A panel that comes up stands over those that lie in the same place.
 void PanelView::ShowCommon() {
-  const bool comes_up = GetControl().Visible() && Widget()->isHidden();
+  const bool was_hidden = Widget()->isHidden();
   CaptionedView::ShowCommon();
-  if (comes_up) Widget()->raise();
+  if (was_hidden && !Widget()->isHidden()) RaiseWithHolders(*Widget());
+  if (!was_hidden && Widget()->isHidden()) LowerEmptyHolders(*Widget());
 }
 
 void PanelView::ReadKind(ControlState& state) const {

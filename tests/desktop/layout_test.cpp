@@ -62,6 +62,53 @@ TEST_P(Layout, CutsNothingAndCoversNothing) {
   for (std::string line; std::getline(script, line) && !HasFatalFailure();) Play(line);
 }
 
+/// Panels that take each other's place, where a handler ends half-way.
+class PanelsInOnePlace : public testing::Test {
+ protected:
+  PanelsInOnePlace() {
+    club_.DoAll({"click imgSheets", "pick cboResGrade =A Grade", "date Cal 2004-03-31",
+                 "click cmdGotoResults", "pick cboResTeam =Bluebells"});
+  }
+  QString Faults() {
+    QWidget& window = *WindowOf("frmResults");
+    window.resize(kSmall);
+    QApplication::processEvents();
+    return LayoutFaults(window).join("; ");
+  }
+
+  WindowClub club_;
+};
+
+TEST_F(PanelsInOnePlace, CoverNothingAfterAFailure) {
+  int failed = 0;
+  for (int operation = 1; operation <= 12; ++operation) {
+    club_.Do("fault any " + std::to_string(operation) + " 57");
+    club_.Do("pick lstFinished 0");
+    failed += club_.Count("error");
+    club_.Do("fault off");
+    EXPECT_EQ(Faults(), QString()) << "operation " << operation;
+    if (club_.Shown("cmdResultsCancel")) club_.Do("click cmdResultsCancel");
+  }
+  EXPECT_GT(failed, 3);
+}
+
+TEST_F(PanelsInOnePlace, LetASheetWithoutARecordBeLeft) {
+  club_.DoAll({"pick lstFinished 0", "click cmdResultsCancel"});
+  auto results = club_.Results("Winter_A Grade.qzr");
+  for (ResultRecord& result : results) result.Team = "Elsewhere";
+  club_.WriteResults("Winter_A Grade.qzr", results);
+  club_.Do("pick lstFinished 0");
+  ASSERT_TRUE(club_.Shown("fraResults") && club_.Shown("fraResControls"));
+  // The sheet lies on top, so that one can get away from it.
+  const QString faults = Faults();
+  for (const char* const name : {"txtAgg", "chkFF", "cmdSave", "cmdResultsCancel"}) {
+    EXPECT_FALSE(faults.contains(name)) << faults.toStdString();
+  }
+  club_.DoAll({"click chkFF", "click cmdResultsCancel"});
+  EXPECT_EQ(Faults(), QString());
+  club_.Do("click cmdLeaveResults");
+}
+
 INSTANTIATE_TEST_SUITE_P(Of, Layout, testing::ValuesIn(Scripts()), [](const auto& script) {
   std::string name = script.param.stem().string();
   std::replace(name.begin(), name.end(), '-', '_');

@@ -9,6 +9,7 @@ constexpr int kMargin = 6;  ///< room for the frame, in pixels
 constexpr double kFrameWidth = 3;
 constexpr double kRadius = 8;
 constexpr double kFaded = 0.35;
+constexpr double kLineShape = 4;  ///< so many times as wide as high, a picture is a line of a menu
 
 }  // namespace
 
@@ -42,6 +43,8 @@ QRectF PictureButton::PictureArea() const {
   size.scale(room.size(), Qt::KeepAspectRatio);
   QRectF area(QPointF(0, 0), size);
   area.moveCenter(room.center());
+  // The words of a line stand below those of the line above, whatever its height.
+  if (size.width() > kLineShape * size.height()) area.moveLeft(room.left());
   return area;
 }
 
@@ -52,10 +55,18 @@ void PictureButton::paintEvent(QPaintEvent* /*event*/) {
   PaintFrame(painter);
 }
 
+/// A disabled picture fades as a whole: part by part, what lies behind would shine through.
 void PictureButton::PaintPicture(QPainter& painter) {
-  if (!isEnabled()) painter.setOpacity(kFaded);
   const QRectF area = PictureArea();
-  picture_.render(&painter, isDown() ? area.translated(1, 1) : area);
+  if (isEnabled()) return picture_.render(&painter, isDown() ? area.translated(1, 1) : area);
+  QPixmap whole(size() * devicePixelRatioF());
+  whole.setDevicePixelRatio(devicePixelRatioF());
+  whole.fill(Qt::transparent);
+  QPainter on(&whole);
+  picture_.render(&on, area);
+  on.end();
+  painter.setOpacity(kFaded);
+  painter.drawPixmap(0, 0, whole);
   painter.setOpacity(1);
 }
 

@@ -1,7 +1,9 @@
 #include "desktop/theme.h"
 
+#include <algorithm>
 #include <array>
 
+#include <QDateEdit>
 #include <QFontDatabase>
 #include <QPainter>
 #include <QPalette>
@@ -36,6 +38,7 @@ constexpr int kEntryHeight = 30;
 constexpr int kLineHeight = 24;
 constexpr int kLineAir = 6;
 constexpr int kCardTitleIndent = 24;
+constexpr int kCardTitleAir = 8;  ///< above and below
 
 bool Plays(const QWidget* widget, const char* role) {
   return widget != nullptr && widget->property("role") == role;
@@ -59,6 +62,10 @@ class Style : public QProxyStyle {
       case CT_LineEdit:
       case CT_ComboBox:
       case CT_SpinBox:
+        // A date asks for more than other entries of the same type.
+        if (qobject_cast<const QDateEdit*>(widget) != nullptr) {
+          return {size.width(), std::max(contents.height(), kEntryHeight)};
+        }
         return size.expandedTo({0, kEntryHeight});
       case CT_ItemViewItem:
         // Some air tells a line that is broken in two from two lines.
@@ -68,21 +75,18 @@ class Style : public QProxyStyle {
     }
   }
 
-  /// A card is a panel that stands over others: filled, and framed all round with its title.
   void drawComplexControl(ComplexControl control, const QStyleOptionComplex* option,
                           QPainter* painter, const QWidget* widget) const override {
-    if (control == CC_GroupBox && IsCard(widget)) {
-      painter->fillRect(option->rect, QColor(kCream));
-      painter->setPen(QColor(kGreen));
-      painter->drawRect(option->rect.adjusted(0, 0, -1, -1));
-    }
     const auto* const group = qstyleoption_cast<const QStyleOptionGroupBox*>(option);
-    if (group == nullptr || widget == nullptr || !widget->isEnabled()) {
+    if (group == nullptr) {
       return QProxyStyle::drawComplexControl(control, option, painter, widget);
     }
     QStyleOptionGroupBox own = *group;
-    const auto meaning = static_cast<Meaning>(widget->property(kMeaning).toInt());
-    own.palette.setColor(QPalette::WindowText, ColorOf(meaning));
+    if (IsCard(widget)) DrawCard(own, painter, widget);
+    if (widget != nullptr && widget->isEnabled()) {
+      const auto meaning = static_cast<Meaning>(widget->property(kMeaning).toInt());
+      own.palette.setColor(QPalette::WindowText, ColorOf(meaning));
+    }
     QProxyStyle::drawComplexControl(control, &own, painter, widget);
   }
 
@@ -121,8 +125,9 @@ class Style : public QProxyStyle {
   QRect subControlRect(ComplexControl control, const QStyleOptionComplex* option, SubControl part,
                        const QWidget* widget) const override {
     const QRect place = QProxyStyle::subControlRect(control, option, part, widget);
-    const bool title = control == CC_GroupBox && part == SC_GroupBoxLabel;
-    return title && IsCard(widget) ? place.translated(kCardTitleIndent, 0) : place;
+    if (control != CC_GroupBox || !IsCard(widget)) return place;
+    if (part == SC_GroupBoxLabel) return place.translated(kCardTitleIndent, kCardTitleAir);
+    return part == SC_GroupBoxContents ? place.adjusted(0, 2 * kCardTitleAir, 0, 0) : place;
   }
 
   int styleHint(StyleHint hint, const QStyleOption* option, const QWidget* widget,
@@ -135,6 +140,20 @@ class Style : public QProxyStyle {
       default:
         return QProxyStyle::styleHint(hint, option, widget, data);
     }
+  }
+
+ private:
+  /// A card is a panel that stands over others: filled, framed all round, its title in a line of
+  /// its own.
+  void DrawCard(QStyleOptionGroupBox& group, QPainter* painter, const QWidget* widget) const {
+    const QRect title = subControlRect(CC_GroupBox, &group, SC_GroupBoxLabel, widget);
+    const int rule = title.bottom() + kCardTitleAir;
+    painter->fillRect(group.rect, QColor(kCream));
+    painter->setPen(QColor(kWire));
+    painter->drawLine(group.rect.left(), rule, group.rect.right(), rule);
+    painter->setPen(QColor(kGreen));
+    painter->drawRect(group.rect.adjusted(0, 0, -1, -1));
+    group.subControls &= ~SC_GroupBoxFrame;
   }
 };
 

@@ -97,6 +97,7 @@ std::optional<std::pair<int, int>> WindowFace::Shot(const std::string& file,
   if (front == nullptr) return std::nullopt;
   QWidget& window = front->Window();
   if (size) window.resize(size->first, size->second);
+  window.activateWindow();  // the focus is only seen in a window that has it
   SettleEvents();
   const QPixmap picture = window.grab();
   if (!picture.save(QString::fromStdString(file), "PNG")) return std::nullopt;

@@ -31,7 +31,10 @@ class Layout : public testing::TestWithParam<fs::path> {
  protected:
   void Play(const std::string& line) {
     if (line.empty() || line.starts_with('#') || line.starts_with("shot")) return;
-    club_.Do(line);
+    const Json answer = club_.Do(line);
+    EXPECT_FALSE(answer.value("lost", false)) << line;
+    EXPECT_EQ(club_.Count("error"), 0) << line;
+    for (const SeenBox& box : club_.Boxes()) EXPECT_FALSE(box.unexpected) << line << box.text;
     const std::string front = club_.Front();
     QWidget* const window = WindowOf(front);
     ASSERT_NE(window, nullptr) << front;

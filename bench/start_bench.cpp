@@ -1,6 +1,6 @@
 // From starting the process to its first painted window: the program against an empty window.
-// Without a display both are drawn offscreen, where the empty window needs nothing of what a window
-// on a display needs: the ratio is larger there.
+// To be run on a display. Drawn offscreen, the empty window needs nothing of what a window on a
+// display needs, and the ratio is larger.
 
 #include <spawn.h>
 #include <sys/wait.h>
@@ -34,8 +34,7 @@ int StartProgram(int argc, char** argv) {
   ApplyTheme();
   const QString folder = QString::fromLocal8Bit(argv[2]);
   Desktop desktop(folder, folder);
-  fonts.Wait();
-  return desktop.Start() ? QApplication::exec() : 1;
+  return desktop.Start([&fonts] { fonts.Wait(); }) ? QApplication::exec() : 1;
 }
 
 std::string TemporaryFolder() {

@@ -15,7 +15,7 @@ build_packages=(
 )
 check_packages=(
   libgtest-dev libgmock-dev libbenchmark-dev libsqlite3-dev
-  clang-format clang-tidy poppler-utils python3 git
+  clang-format clang-tidy poppler-utils python3 git xvfb xauth
 )
 
 is_installed() {

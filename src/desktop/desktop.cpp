@@ -1,5 +1,7 @@
 #include "desktop/desktop.h"
 
+#include <utility>
+
 #include <QApplication>
 #include <QDir>
 
@@ -24,7 +26,8 @@ Desktop::Desktop(const QString& working_folder, const QString& program_folder)
 
 Desktop::~Desktop() { qApp->removeEventFilter(&filter_); }
 
-bool Desktop::Start() {
+bool Desktop::Start(std::function<void()> before_showing) {
+  windows_.CallBeforeShowing(std::move(before_showing));
   program_.Start();
   windows_.Refresh();
   return !program_.GetScreens().Ended();

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <functional>
 #include <memory>
 #include <string>
 
@@ -22,8 +23,9 @@ class Desktop : private Observer {
   Desktop(const QString& working_folder, const QString& program_folder);
   ~Desktop() override;
 
-  /// Shows the main menu. Answers false when the program has ended itself on the way.
-  bool Start();
+  /// Shows the main menu, with `before_showing` between the making of its window and the showing.
+  /// Answers false when the program has ended itself on the way.
+  bool Start(std::function<void()> before_showing = nullptr);
 
  private:
   void Refresh();

@@ -15,6 +15,5 @@ int main(int argc, char** argv) {
   const QString own = QApplication::applicationDirPath();
   const QString data = QStandardPaths::writableLocation(QStandardPaths::AppDataLocation);
   marlowbeck::Desktop desktop(marlowbeck::WorkingFolder(own, data), own);
-  fonts.Wait();
-  return desktop.Start() ? QApplication::exec() : 0;
+  return desktop.Start([&fonts] { fonts.Wait(); }) ? QApplication::exec() : 0;
 }

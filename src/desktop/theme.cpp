@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <array>
+#include <chrono>
 
 #include <QDateEdit>
 #include <QFontDatabase>
@@ -10,6 +11,7 @@
 #include <QProxyStyle>
 #include <QStyleFactory>
 #include <QStyleOption>
+#include <QTimer>
 
 namespace marlowbeck {
 namespace {
@@ -39,6 +41,8 @@ constexpr int kLineHeight = 24;
 constexpr int kLineAir = 6;
 constexpr int kCardTitleIndent = 24;
 constexpr int kCardTitleAir = 8;  ///< above and below
+
+constexpr std::chrono::milliseconds kIconDelay{200};
 
 bool Plays(const QWidget* widget, const char* role) {
   return widget != nullptr && widget->property("role") == role;
@@ -229,9 +233,10 @@ void ApplyTheme() {
   QApplication::setStyle(new Style);  // taken over by the application
   QApplication::setPalette(OurPalette());
   QApplication::setFont(WorkFont());
-  QApplication::setWindowIcon(IconNamed("app"));
   QApplication::setEffectEnabled(Qt::UI_AnimateCombo, false);
   QApplication::setQuitOnLastWindowClosed(false);
+  // Drawn in many sizes, which the first window has not to wait for.
+  QTimer::singleShot(kIconDelay, qApp, [] { QApplication::setWindowIcon(IconNamed("app")); });
 }
 
 void ApplyRoles(QWidget& window) {

@@ -90,7 +90,9 @@ void Windows::DropWindows() {
 /// First what comes, then what goes, so that the desktop behind is not seen in between.
 void Windows::ShowAndHide() {
   for (ScreenWindow* window : windows_) {
-    if (window->GetScreen().Visible() && !window->Window().isVisible()) window->Show();
+    if (!window->GetScreen().Visible() || window->Window().isVisible()) continue;
+    if (const auto call = std::exchange(before_showing_, nullptr)) call();
+    window->Show();
   }
   BringFrontUp();
   for (ScreenWindow* window : windows_) {

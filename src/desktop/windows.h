@@ -4,6 +4,7 @@
 #include <functional>
 #include <memory>
 #include <optional>
+#include <utility>
 #include <vector>
 
 #include "desktop/screen_window.h"
@@ -27,6 +28,9 @@ class Windows {
   Outcome Do(View* acted, const Act& act);
   /// The same for a key: a box that keeps the focus is entered anew.
   Outcome DoByKey(const Act& act);
+
+  /// Something to be done once, just before the first window is shown.
+  void CallBeforeShowing(std::function<void()> call) { before_showing_ = std::move(call); }
 
   /// Brings all windows up to date.
   void Refresh();
@@ -56,6 +60,7 @@ class Windows {
   Screens& screens_;
   Hand& hand_;
   std::function<void()> ended_;
+  std::function<void()> before_showing_;
   std::vector<ScreenWindow*> windows_;
   const Screen* front_ = nullptr;
   bool acting_ = false;

@@ -6,6 +6,8 @@
 
 #include "data/text.h"
 #include "desktop/encoding.h"
+#include "desktop/printer_font.h"
+#include "print/font_box.h"
 
 namespace marlowbeck {
 namespace {
@@ -111,6 +113,9 @@ bool LabelView::ClicksAt(const QWidget& /*on*/, QPoint /*at*/) const {
 }
 
 void LabelView::ShowKind() {
+  if (const auto* const in_its_font = dynamic_cast<const FontLabel*>(&GetControl())) {
+    label_.setFont(FontOnScreen(in_its_font->Font()));
+  }
   label_.setText(ToQt(GetControl().Caption()));
   label_.setAccessibleName(Spoken(GetControl().Caption()));
 }

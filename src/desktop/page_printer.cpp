@@ -17,6 +17,7 @@
 
 #include "data/runtime_error.h"
 #include "desktop/encoding.h"
+#include "desktop/printer_font.h"
 
 namespace marlowbeck {
 namespace {
@@ -27,21 +28,6 @@ constexpr int kPaperWidth = 11906;  ///< A4, in twips
 constexpr int kPaperHeight = 16838;
 constexpr int kMargin = 360;  ///< that no printer prints on, in twips
 constexpr double kRule = 10;  ///< width of lines, in twips
-
-/// The font as it is drawn where one unit is a twip. Fonts that only one system has stand for the
-/// plain one that every system gets.
-QFont Drawn(const PrinterFont& font) {
-  const QString name = font.name == "MS Sans Serif" ? QString() : ToQt(font.name);
-  QFont drawn;
-  drawn.setFamilies(name.isEmpty() ? QStringList{"Liberation Sans", "Arial"}
-                                   : QStringList{name, "Liberation Sans", "Arial"});
-  drawn.setPixelSize(std::max(font.size, 1) * kTwipsPerPoint);
-  drawn.setBold(font.bold);
-  drawn.setItalic(font.italic);
-  drawn.setUnderline(font.underline);
-  drawn.setHintingPreference(QFont::PreferNoHinting);
-  return drawn;
-}
 
 }  // namespace
 
@@ -82,11 +68,11 @@ int PagePrinter::PageHeight() {
 }
 
 double PagePrinter::TextWidth(const std::string& text) {
-  return QFontMetricsF(Drawn(font_)).horizontalAdvance(ToQt(text));
+  return QFontMetricsF(FontInTwips(font_)).horizontalAdvance(ToQt(text));
 }
 
 double PagePrinter::TextHeight(const std::string& /*text*/) {
-  return QFontMetricsF(Drawn(font_)).height();
+  return QFontMetricsF(FontInTwips(font_)).height();
 }
 
 void PagePrinter::Print(double x, double y, const std::string& text) {
@@ -142,7 +128,7 @@ void PagePrinter::Paint(QPagedPaintDevice& device, const Pages& pages) {
 void PagePrinter::Perform(QPainter& painter, const Operation& operation) {
   painter.setPen(QPen(Qt::black, kRule));
   if (const auto* text = std::get_if<TextAt>(&operation)) {
-    painter.setFont(Drawn(text->font));
+    painter.setFont(FontInTwips(text->font));
     // A text stands by its upper left corner.
     const double ascent = QFontMetricsF(painter.font()).ascent();
     painter.drawText(text->place + QPointF(0, ascent), text->text);

@@ -3,14 +3,14 @@
 #include <string>
 
 #include "data/integer.h"
-#include "data/numbers.h"
+#include "data/runtime_error.h"
 
 namespace marlowbeck {
 namespace {
 
 constexpr const char* kFontFile = "FontName.qz3";
 
-void SetFont(Session& session, std::int32_t size, std::string_view name, bool bold, bool italic) {
+void Take(Session& session, std::int32_t size, std::string_view name, bool bold, bool italic) {
   session.PrintFontSize = size;
   session.PrintFontName = name;
   session.PrintFontBold = bold;
@@ -25,7 +25,8 @@ void Read(const Context& context) {
   const bool bold = reader.Truth();
   const bool italic = reader.Truth();
   context.channels.Close(Channel::Side);
-  SetFont(context.session, size, name, bold, italic);
+  if (size < 1 || name.empty()) throw RunTimeError(ErrorNumber::TypeMismatch);
+  Take(context.session, size, name, bold, italic);
 }
 
 }  // namespace
@@ -36,7 +37,7 @@ void ReadFontSettings(const Context& context) {
     Read(context);
   } catch (const RunTimeError&) {
     context.channels.AbandonAll();
-    SetFont(context.session, 10, "MS Sans Serif", false, false);
+    Take(context.session, 10, "MS Sans Serif", false, false);
     WriteFontSettings(context);
   }
 }
@@ -51,9 +52,9 @@ void WriteFontSettings(const Context& context) {
   context.channels.Close(Channel::Side);
 }
 
-void AlignFontBox(const Session& session, Label& lblFont, Label& lblPrFont) {
-  lblFont.SetCaption(session.PrintFontName);
-  lblPrFont.SetCaption("Font size = " + NumberText(session.PrintFontSize) + "pts.");
+PrinterFont PrinterFontOf(const Session& session) {
+  return {session.PrintFontName, session.PrintFontSize, session.PrintFontBold,
+          session.PrintFontItalic, false};
 }
 
 }  // namespace marlowbeck

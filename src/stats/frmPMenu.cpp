@@ -2,7 +2,6 @@
 
 #include "data/competition.h"
 #include "data/text.h"
-#include "print/font_settings.h"
 #include "session/shared_procedures.h"
 #include "ui/screens.h"
 
@@ -65,8 +64,7 @@ void frmPMenu::Load() {
   StartScreen();
   context_.GoToWorkingFolder();
   context_.channels.CloseAll();
-  ReadFontSettings(context_);
-  AlignFontBox(session_, lblFont, lblPrFont);
+  font_box_.GetFont();
   GetPlayerFileName();
 }
 

@@ -3,6 +3,7 @@
 #include <array>
 #include <vector>
 
+#include "print/font_box.h"
 #include "stats/team_reports.h"
 #include "ui/context.h"
 #include "ui/controls.h"
@@ -68,7 +69,7 @@ struct frmPMenu : Screen {
 
   // The printer font and the print panels.
   Panel fraFontPick{*this, "fraFontPick", "Printer Font"};
-  Label lblFont{fraFontPick, "lblFont"};
+  FontLabel lblFont{fraFontPick, "lblFont"};
   Label lblPrFont{fraFontPick, "lblPrFont"};
   Label lblFontInfo{*this, "lblFontInfo", " Click to change font. "};
   Panel picPrint{*this, "picPrint", "Print Options"};
@@ -127,6 +128,7 @@ struct frmPMenu : Screen {
 
   const Context& context_;
   Session& session_;
+  FontBox font_box_{context_, {fraFontPick, lblFont, lblPrFont, lblFontInfo}};
   TeamReports reports_;
   std::vector<ProgressiveRow> progressive_;  ///< the rows of the last CalcProg
 };

@@ -1,0 +1,16 @@
+#pragma once
+
+#include <QFont>
+
+#include "platform/printer.h"
+
+namespace marlowbeck {
+
+// The printer's font as it is drawn. What a machine has not is drawn in the plain face that every
+// system gets; "MS Sans Serif", which only one system has, in one of like widths.
+
+/// Where one unit is a twip.
+[[nodiscard]] QFont FontInTwips(const PrinterFont& font);
+[[nodiscard]] QFont FontOnScreen(const PrinterFont& font);
+
+}  // namespace marlowbeck

@@ -1,0 +1,77 @@
+#include "print/print_panel.h"
+
+#include <algorithm>
+
+#include "data/numbers.h"
+#include "session/messages.h"
+
+namespace marlowbeck {
+namespace {
+
+constexpr double kLeastDistance = 1;  // centimetres
+constexpr double kGreatestDistance = 30.5;
+constexpr double kStep = 0.5;
+
+}  // namespace
+
+std::string_view OrientationWord(Orientation orientation) {
+  return orientation == Orientation::Portrait ? "Portrait" : "Landscape";
+}
+
+void PrintPanel::PrinterInfo() {
+  Printer& printer = context_.platform.printer;
+  controls_.printer_name.SetCaption(printer.DeviceName());
+  controls_.orientation.SetCaption(OrientationWord(printer.GetOrientation()));
+}
+
+void PrintPanel::Open() {
+  PrinterInfo();
+  controls_.copies.SetText("1");
+  context_.platform.sound.Beep();
+  if (controls_.from_top == nullptr) return;
+  controls_.from_top->Clear();
+  for (double distance = kLeastDistance; distance <= kGreatestDistance; distance += kStep) {
+    controls_.from_top->AddLine(NumberText(distance));
+  }
+  controls_.from_top->SetIndex(0);
+}
+
+void PrintPanel::SetUpPrinter() {
+  Printer& printer = context_.platform.printer;
+  const auto chosen = context_.platform.dialogs.PrinterSetup(printer.GetOrientation());
+  if (chosen) printer.SetOrientation(*chosen);
+  PrinterInfo();
+}
+
+bool PrintPanel::Check(std::initializer_list<const OptionButton*> options,
+                       std::string_view none_selected) {
+  const bool any = std::any_of(options.begin(), options.end(),
+                               [](const OptionButton* option) { return option->Value(); });
+  if (any) return CheckDistance() && CheckCopies();
+  Warning(context_, none_selected);
+  return false;
+}
+
+bool PrintPanel::CheckDistance() {
+  return controls_.from_top == nullptr ||
+         AtLeastOne(controls_.from_top->Text(), "You must show CENTIMETRES from Top of Page!    ");
+}
+
+bool PrintPanel::CheckCopies() {
+  return AtLeastOne(controls_.copies.Text(), "You must show NUMBER of COPIES to print!    ");
+}
+
+bool PrintPanel::AtLeastOne(std::string_view text, std::string_view message) {
+  if (Val(text) >= 1) return true;
+  Warning(context_, message);
+  return false;
+}
+
+PrintOptions PrintPanel::Chosen() const {
+  PrintOptions chosen;
+  chosen.copies = Val(controls_.copies.Text());
+  if (controls_.from_top != nullptr) chosen.centimetres = Val(controls_.from_top->Text());
+  return chosen;
+}
+
+}  // namespace marlowbeck

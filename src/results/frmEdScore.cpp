@@ -53,8 +53,7 @@ void frmEdScore::Load() {
   ClearResults();
   ReadHandOver();
   EnableBoxes();
-  FindPlayer();
-  if (session.Flag > 0) FindRecord();
+  if (FindPlayer()) FindRecord();
   WhichBoxes();
   if (session.EditRecord > 0) scores.Fill(record_);
 }
@@ -73,17 +72,18 @@ void frmEdScore::ReadHandOver() {
   NameGradeFiles(session);
 }
 
-/// The id goes into Flag, which stays 0 where there is no such player; so it is for a forfeit,
+/// Puts the id into Flag, which stays 0 where there is no such player; so it is for a forfeit,
 /// whose star belongs to no name.
-void frmEdScore::FindPlayer() {
+bool frmEdScore::FindPlayer() {
   Session& session = context_.session;
   const auto player =
       FindPlayerByLine(session, context_.channels, txtPlayer.Text(), kNameSeparator);
-  if (!player) return;
+  if (!player) return false;
   // KEPT: the id is held in 16 bits, so that a player numbered above 32767 cannot be corrected
   // here; a repair would hold it in 32.
   session.Flag = player->ID;
   session.BestOfThree = player->BestOfThree;
+  return true;
 }
 
 void frmEdScore::FindRecord() {

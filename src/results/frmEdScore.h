@@ -41,7 +41,7 @@ struct frmEdScore : Screen {
 
  private:
   void ReadHandOver();
-  void FindPlayer();
+  [[nodiscard]] bool FindPlayer();
   void FindRecord();
   void ReadRecord();
   void WriteRecord();

@@ -245,6 +245,20 @@ TEST_F(ChangeDate, AWorkDateThatCannotBeReadEndsInTheErrorBox) {
   ExpectReports("frmChangeDate");
 }
 
+TEST_F(ChangeDate, AMatchOfDateNoughtCannotBeMoved) {
+  std::vector<ResultRecord> results = {Night(11, "Hawks", "Lions"), Night(11, "Hawks", "Cubs")};
+  results[0].GameDate = Date{};
+  Lay(results);
+  OpenWeekly();
+  ASSERT_EQ(Lines("lstAllDates"), (TextList{"30/12/1899", "31/03/2004"}));
+  Do("pick lstAllDates 0");
+  EXPECT_EQ(Caption("lblDT"), "30/12/1899 (v's Lions)");
+  Do("click cmdChangeDate");
+  EXPECT_EQ(Front(), "frmPMenu");
+  EXPECT_FALSE(HasFile("dc.qz3"));
+  EXPECT_EQ(File("WkDate.qz3"), "#2004-03-31#\r\n");
+}
+
 TEST_F(ChangeDate, WithoutAnOpenCompetitionNoDateIsRead) {
   Lay(Season());
   OpenWeekly();

@@ -52,6 +52,11 @@ TEST_F(ChangeOpposition, TheFreeTeamsAreOfferedAndTheFirstIsSelected) {
   EXPECT_EQ(Text("cboReDoOpp"), "Cubs");
 }
 
+TEST_F(ChangeOpposition, ATeamThatOnlyStandsAsTeamOnTheDateIsNotOffered) {
+  Open(entered);  // Rovers met a team that is gone
+  EXPECT_EQ(Lines("cboReDoOpp"), TextList{"Cubs"});
+}
+
 TEST_F(ChangeOpposition, OpenedAgainItOffersNoTeamTwice) {
   Open({entered[1]});
   DoAll({"click SSCommand3", "click panChangeOpp"});

@@ -137,6 +137,23 @@ TEST_F(EditScore, TheTableShowsTheNewFigures) {
   EXPECT_EQ(Index("lstAllDates"), 1);
 }
 
+TEST_F(EditScore, AFailureInTheReportsKeepsNobodyInTheDialog) {
+  Open();
+  // Another night of the table has lost its shots meanwhile, so that it cannot be put in order.
+  std::vector<ResultRecord> results = Season();
+  results[2].Shots = 0;
+  WriteResults(kAResults, results);
+  Do("type txtAgg 951");
+  Do("click cmdSave");
+  EXPECT_EQ(Errors(), (std::vector<int>{11}));
+  EXPECT_EQ(Count("sound"), 1);
+  results[1].Aggregate = 951;
+  ExpectSaved(results);
+  EXPECT_EQ(Front(), "frmPMenu");
+  EXPECT_FALSE(Loaded("frmEdScore"));
+  EXPECT_TRUE(Enabled("cboResTeam"));
+}
+
 TEST_F(EditScore, SavingWhatIsThereChangesNothing) {
   Open();
   Do("click cmdSave");
@@ -324,6 +341,25 @@ TEST_F(EditScore, ANumberAbove32767StaysBeyondReach) {
   EXPECT_EQ(InSession("EditRecord"), 0);
   Do("click Command2");
   ExpectReports("frmEdScore");
+}
+
+TEST_F(EditScore, NumbersOfNoughtAndBelowCanBeCorrected) {
+  Lay({});
+  OpenWeekly();
+  for (const int id : {0, -7, -32768}) {
+    SCOPED_TRACE(id);
+    std::vector<PlayerRecord> players = LeaguePlayers();
+    players[2].ID = id;
+    ResultRecord night = Full();
+    night.ID = id;
+    WritePlayers(kLeagueFile, players);
+    WriteResults(kAResults, {night});
+    Do("pick cboResTeam =Hawks");
+    Do("dblcell grdWeek 1 0");
+    EXPECT_EQ(InSession("EditRecord"), 1);
+    EXPECT_EQ(Text("txtAgg"), "950");
+    Do("click Command2");
+  }
 }
 
 TEST_F(EditScore, TheHighestNumberCanBeCorrected) {

@@ -56,13 +56,18 @@ void ChangeRecords(Channels& channels, Channel channel, const Change& change) {
   if (ChangeWholeRecords(bytes, record_length, change)) channels.ReplaceWhole(path, content);
 }
 
-void RemoveRecords(Channels& channels, Channel channel, const Doomed& doomed) {
-  const std::string path = channels.Path(channel);
+void CopyRecordsWithout(Channels& channels, Channel channel, const Doomed& doomed,
+                        const std::string& work_file) {
   const std::size_t record_length = channels.RecordLength(channel);
   const std::vector<std::byte> staying = RecordsThatStay(channels, channel, doomed);
-  const std::string work_file = WorkFileBeside(path);
   channels.CloseAll();
   WriteCopy(channels, work_file, record_length, staying);
+}
+
+void RemoveRecords(Channels& channels, Channel channel, const Doomed& doomed) {
+  const std::string path = channels.Path(channel);
+  const std::string work_file = WorkFileBeside(path);
+  CopyRecordsWithout(channels, channel, doomed, work_file);
   channels.Files().Replace(work_file, path);
 }
 

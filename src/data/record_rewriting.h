@@ -2,6 +2,7 @@
 
 #include <functional>
 #include <span>
+#include <string>
 
 #include "data/channels.h"
 
@@ -20,12 +21,17 @@ void ChangeRecords(Channels& channels, Channel channel, const Change& change);
 /// Whether a record is to go.
 using Doomed = std::function<bool(Bytes record, int number)>;
 
-/// Leaves the doomed records out: no file has holes or marks. The others are copied in their order
-/// to `TEMP.RES` beside the file, which takes its place. Bytes behind the last whole record go. A
-/// copy that was finished but could not take the file's place is left behind.
+/// Copies all records but the doomed ones to a work file, in their order and numbered from 1: no
+/// file has holes or marks. Bytes behind the last whole record are no record. The copy is on the
+/// disk when this returns; one that could not be finished is deleted.
 ///
-/// KEPT: a `TEMP.RES` that is there already is written over as it is, so that records of it beyond
-/// the new ones end up in the file; a repair would empty it first.
+/// KEPT: a work file that is there already is written over as it is, so that records of it beyond
+/// the new ones end up in the file whose place it takes; a repair would empty it first.
+void CopyRecordsWithout(Channels& channels, Channel channel, const Doomed& doomed,
+                        const std::string& work_file);
+
+/// Leaves the doomed records out: a copy without them, `TEMP.RES` beside the file, takes its place.
+/// One that is finished but cannot take it is left behind.
 void RemoveRecords(Channels& channels, Channel channel, const Doomed& doomed);
 
 }  // namespace marlowbeck

@@ -1,9 +1,9 @@
 // Deleting the result that is open for correction: the file is rewritten without its record.
 
 #include "data/competition.h"
+#include "data/record_rewriting.h"
 #include "data/text.h"
 #include "results/frmResults.h"
-#include "results/result_removal.h"
 #include "session/messages.h"
 
 namespace marlowbeck {
@@ -14,7 +14,9 @@ void frmResults::cmdEdDelete_Click() {
   context_.channels.CloseAll();
   OpenResultSFile(session, context_.channels);
   const std::string work_file = WithExtension(session.ResultsFile, ".qz3");
-  CopyResultsWithout(context_.channels, session.EditRecord, work_file);
+  CopyRecordsWithout(
+      context_.channels, Channel::Results,
+      [&](Bytes, int number) { return number == session.EditRecord; }, work_file);
   PutInPlace(work_file);
   fraResults.Hide();
   fraEdButtons.Hide();

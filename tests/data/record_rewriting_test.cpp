@@ -158,6 +158,56 @@ TEST_F(RecordRemovalTest, AKillAnywhereLeavesTheOldFileOrTheNewOne) {
   KillEverywhere("aaaaxxxxbbbb", "aaaabbbb", [this] { Remove(); });
 }
 
+/// A copy to a work file of a name of its own, without one record.
+class RecordCopyTest : public RecordRewritingTest {
+ protected:
+  std::string CopyWithout(const std::string& content, int doomed, std::size_t length = kLength) {
+    folder.Write("r", content);
+    channels.OpenRandom(Channel::Results, "r", length);
+    CopyRecordsWithout(
+        channels, Channel::Results, [=](Bytes, int number) { return number == doomed; }, "copy");
+    return folder.Read("copy");
+  }
+};
+
+TEST_F(RecordCopyTest, LeavesOutEveryRecordInTurn) {
+  const std::string records = "aaaabbbbccccddddeeee";
+  for (int number = 1; number <= 5; ++number) {
+    std::string others = records;
+    others.erase((static_cast<std::size_t>(number) - 1) * kLength, kLength);
+    folder.Write("copy", "");
+    EXPECT_EQ(CopyWithout(records, number), others) << number;
+  }
+}
+
+TEST_F(RecordCopyTest, OfOneRecordLeavesNone) { EXPECT_EQ(CopyWithout("aaaa", 1), ""); }
+
+TEST_F(RecordCopyTest, LeavesTheFileItselfAsItIsAndAllClosed) {
+  CopyWithout("aaaabbbbccc", 1);
+  EXPECT_EQ(folder.Read("r"), "aaaabbbbccc");
+  EXPECT_ERROR(52, (void)channels.RecordCount(Channel::Results));
+  EXPECT_ERROR(52, (void)channels.RecordCount(Channel::Side));
+}
+
+TEST_F(RecordCopyTest, KeepsTheLastRecordsOfALongerWorkFile) {
+  folder.Write("copy", "111122223333");
+  EXPECT_EQ(CopyWithout("aaaabbbb", 2), "aaaa22223333");
+}
+
+TEST_F(RecordCopyTest, ThatIsCutShortIsDeleted) {
+  files.Plan().CutAt(1, 6, kDiskFull);
+  EXPECT_ERROR(kDiskFull, (void)CopyWithout("aaaabbbbcccc", 2));
+  EXPECT_FALSE(folder.Has("copy"));
+}
+
+TEST_F(RecordCopyTest, WorksAtTheLimitOf32767Records) {
+  std::string records(32767 * kResultLength, ' ');
+  for (std::size_t at = 0; at < records.size(); ++at) records[at] = static_cast<char>(at / 148 * 7);
+  const std::string others = CopyWithout(records, 20000, kResultLength);
+  EXPECT_TRUE(others ==
+              records.substr(0, 19999 * kResultLength) + records.substr(20000 * kResultLength));
+}
+
 /// Those that begin with an "x" become one of "y"s.
 class RecordChangeTest : public RecordRewritingTest {
  protected:

@@ -5,6 +5,7 @@
 
 #include "data/runtime_error.h"
 #include "desktop/encoding.h"
+#include "desktop/theme.h"
 
 namespace marlowbeck {
 namespace {
@@ -101,6 +102,10 @@ void ComboView::ShowLines() {
 /// A locked combo may hold a text that is none of its lines; it stands where nothing is picked.
 void ComboView::ShowKind() {
   ShowEditable();
+  if (box_.property(kHeld).toBool() != model_.Held()) {
+    box_.setProperty(kHeld, model_.Held());
+    box_.update();
+  }
   // Another current line would take the cursor out of what is being typed.
   const int cursor = box_.isEditable() ? box_.lineEdit()->cursorPosition() : 0;
   ShowLines();

@@ -76,14 +76,16 @@ void ScreenWindow::BringUpToDate() {
   MarkDefault();
 }
 
-/// The command that Enter goes to looks like it.
+/// The command that Enter goes to looks like it: one that has the focus takes it for itself.
 void ScreenWindow::MarkDefault() {
+  const Control* const focus = screen_->Focus();
+  const bool is_command = focus != nullptr && focus->GetKind() == Kind::Command;
   bool found = false;
   for (const Control* control : screen_->Defaults) {
     const View* const view = ViewOf(*control);
     auto* const button = view == nullptr ? nullptr : qobject_cast<QPushButton*>(view->Widget());
     if (button == nullptr) continue;
-    const bool is_it = !found && control->Enabled() && !button->isHidden();
+    const bool is_it = is_command ? control == focus : !found && control->Live();
     if (button->isDefault() != is_it) button->setDefault(is_it);
     found = found || is_it;
   }

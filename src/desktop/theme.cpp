@@ -50,6 +50,8 @@ bool Plays(const QWidget* widget, const char* role) {
 
 bool IsCard(const QWidget* widget) { return Plays(widget, "card"); }
 
+bool IsHeld(const QWidget* widget) { return widget != nullptr && widget->property(kHeld).toBool(); }
+
 /// Fusion with our measures and our icons.
 class Style : public QProxyStyle {
  public:
@@ -81,6 +83,7 @@ class Style : public QProxyStyle {
 
   void drawComplexControl(ComplexControl control, const QStyleOptionComplex* option,
                           QPainter* painter, const QWidget* widget) const override {
+    if (control == CC_ComboBox && IsHeld(widget)) return DrawHeld(painter, *widget);
     const auto* const group = qstyleoption_cast<const QStyleOptionGroupBox*>(option);
     if (group == nullptr) {
       return QProxyStyle::drawComplexControl(control, option, painter, widget);
@@ -147,6 +150,16 @@ class Style : public QProxyStyle {
   }
 
  private:
+  /// A combo that is held looks like a box that cannot be typed into: it has nothing to drop down.
+  void DrawHeld(QPainter* painter, const QWidget& widget) const {
+    QStyleOptionFrame frame;
+    frame.initFrom(&widget);
+    frame.lineWidth = 1;
+    frame.state |= State_Sunken;
+    frame.palette.setColor(QPalette::Base, frame.palette.color(QPalette::Window));
+    drawPrimitive(PE_PanelLineEdit, &frame, painter, &widget);
+  }
+
   /// A card is a panel that stands over others: filled, framed all round, its title in a line of
   /// its own.
   void DrawCard(QStyleOptionGroupBox& group, QPainter* painter, const QWidget* widget) const {

@@ -12,6 +12,8 @@ namespace marlowbeck {
 
 /// The property of a widget that holds its Meaning as a number.
 inline constexpr const char* kMeaning = "meaning";
+/// The property of a combo that is true while it shows its text and takes no other.
+inline constexpr const char* kHeld = "held";
 
 /// Style, palette and type of the whole application.
 void ApplyTheme();

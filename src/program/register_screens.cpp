@@ -5,6 +5,8 @@
 #include "results/frmChangeDate.h"
 #include "results/frmEdScore.h"
 #include "results/frmResults.h"
+#include "season/frmPlayersLists.h"
+#include "season/frmSearchPlayer.h"
 #include "session/frmAbout.h"
 #include "session/frmBuend.h"
 #include "session/frmDB.h"
@@ -37,6 +39,8 @@ void RegisterScreens(Screens& screens, const Context& context) {
   Register<frmEdScore>(screens, "frmEdScore", context);
   Register<frmChangeDate>(screens, "frmChangeDate", context);
   Register<frmPMenu>(screens, "frmPMenu", context);
+  Register<frmPlayersLists>(screens, "frmPlayersLists", context);
+  Register<frmSearchPlayer>(screens, "frmSearchPlayer", context);
   Register<frmErrors>(screens, "frmErrors", context);
 }
 

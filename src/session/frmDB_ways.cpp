@@ -116,10 +116,9 @@ void frmDB::mnuFix_Click() {
 
 void frmDB::mnuSearchPlayer_Click() {
   Menus();
-  const std::string reply =
-      context_.platform.boxes.Input({"Enter SURNAME to Search for.", "Name Search", {}, {}});
-  if (Trimmed(reply).empty() || !InScreens().Knows("frmSearchPlayer")) return;
-  session_.SearchText = UpperCase(Trimmed(reply));
+  const std::string surname = AskSurname(context_);
+  if (surname.empty()) return;
+  session_.SearchText = surname;
   session_.Flag = 1;
   InScreens().Hide(*this);
   InScreens().Show("frmSearchPlayer");

@@ -99,6 +99,11 @@ std::string PegsDescription(const Session& session, int code) {
   }
 }
 
+std::string AskSurname(const Context& context) {
+  return UpperCase(Trimmed(
+      context.platform.boxes.Input({"Enter SURNAME to Search for.", "Name Search", {}, {}})));
+}
+
 void nofile(const Context& context, Screens& screens, Beep beep) {
   if (const Screen* menu = screens.Find("frmDB")) {
     menu->Find("lblHMPlayers")->SetCaption(" No File Open ");

@@ -33,6 +33,9 @@ void WriteFileName(const Context& context);
 /// The words for a Best of Three code, with the game names of the session: BestOfThreeText.
 [[nodiscard]] std::string PegsDescription(const Session& session, int code);
 
+/// Asks for a surname to search for: trimmed and upper-cased, empty for none.
+[[nodiscard]] std::string AskSurname(const Context& context);
+
 /// Tells that no competition is open, on the main menu and in a box.
 void nofile(const Context& context, Screens& screens, Beep beep);
 

@@ -230,10 +230,9 @@ void frmNames::cmdAddCancel_Click() {
 }
 
 void frmNames::cmdSearch_Click() {
-  const std::string reply =
-      context_.platform.boxes.Input({"Enter SURNAME to Search for.", "Name Search", {}, {}});
-  if (Trimmed(reply).empty() || !InScreens().Knows("frmSearchPlayer")) return;
-  session_.SearchText = UpperCase(Trimmed(reply));
+  const std::string surname = AskSurname(context_);
+  if (surname.empty()) return;
+  session_.SearchText = surname;
   session_.Flag = kSearchFromSetup;
   InScreens().Hide(*this);
   InScreens().Show("frmSearchPlayer");

@@ -133,10 +133,8 @@ void frmPMenu::Image6_Click() {
 }
 
 void frmPMenu::Image12_Click() {
-  const std::string reply =
-      context_.platform.boxes.Input({"Enter SURNAME to Search for.", "Name Search", {}, {}});
-  const std::string surname = UpperCase(Trimmed(reply));
-  if (surname.empty() || !InScreens().Knows("frmSearchPlayer")) return;
+  const std::string surname = AskSurname(context_);
+  if (surname.empty()) return;
   session_.ReportChoice = kSearchChoice;
   session_.SearchText = surname;
   session_.Flag = kSearchFromReports;

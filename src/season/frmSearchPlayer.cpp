@@ -1,0 +1,116 @@
+#include "season/frmSearchPlayer.h"
+
+#include <array>
+
+#include "data/competition.h"
+#include "data/text.h"
+#include "print/tabbed_text.h"
+#include "session/messages.h"
+#include "session/shared_procedures.h"
+#include "ui/screens.h"
+
+namespace marlowbeck {
+namespace {
+
+constexpr int kFromSetup = 2;
+constexpr int kFromReports = 3;
+constexpr std::array<const char*, 4> kHeadings = {"Surname", "Given Name/s", "Team", "Grade"};
+constexpr int kColumns = static_cast<int>(kHeadings.size());
+
+}  // namespace
+
+frmSearchPlayer::frmSearchPlayer(Screens& screens, const Context& context)
+    : Screen(screens, "frmSearchPlayer", "Name Search"),
+      context_(context),
+      session_(context.session) {
+  grdShow.SetFiguresFrom(kColumns);
+  cmdClip.Click = [this] { cmdClip_Click(); };
+  cmdAgain.Click = [this] {
+    SearchInput();
+    ClearGrid();
+    ShowFound();
+  };
+  cmdExit.Click = [this] { InScreens().Unload(*this); };
+  Cancels = {&cmdExit};
+}
+
+void frmSearchPlayer::Load() { ShowFound(); }
+
+void frmSearchPlayer::Unload() {
+  const char* opener = "frmDB";
+  if (session_.Flag == kFromSetup) opener = "frmNames";
+  if (session_.Flag == kFromReports) opener = "frmPMenu";
+  InScreens().Show(opener);
+}
+
+/// Nothing typed keeps the text that was searched for last.
+void frmSearchPlayer::SearchInput() {
+  const std::string surname = AskSurname(context_);
+  if (!surname.empty()) session_.SearchText = surname;
+}
+
+void frmSearchPlayer::ShowFound() {
+  grdShow.SetSize(1, kColumns);
+  for (int column = 0; column < kColumns; ++column) {
+    grdShow.SetCell(0, column, kHeadings[static_cast<std::size_t>(column)]);
+  }
+  GetPlayers();
+}
+
+void frmSearchPlayer::GetPlayers() {
+  session_.RowCount = 0;
+  OpenFile(session_, context_.channels);
+  context_.channels.ForEachRecord(Channel::Players, [&](Bytes record, int) {
+    if (UpperCase(PlayerView(record).Surname()).find(session_.SearchText) == std::string::npos) {
+      return;
+    }
+    // The fields stand as they are in the record, trailing blanks included.
+    const PlayerRecord player = DecodePlayer(record);
+    const int row = ++session_.RowCount;
+    grdShow.SetSize(row + 1, kColumns);
+    grdShow.SetCell(row, 0, player.Surname);
+    grdShow.SetCell(row, 1, player.FirstName);
+    grdShow.SetCell(row, 2, player.Team);
+    grdShow.SetCell(row, 3, player.Grade);
+  });
+  context_.channels.CloseAll();
+  TellCount();
+}
+
+void frmSearchPlayer::TellCount() {
+  const int found = session_.RowCount;
+  grdShow.SetVisible(found > 0);
+  cmdClip.SetVisible(found > 0);
+  if (found == 0) {
+    lblInfo.SetCaption("Name/s containing " + session_.SearchText + " not found !");
+    return;
+  }
+  lblInfo.SetCaption("Found " + std::to_string(found) + (found == 1 ? " name" : " names") +
+                     " containing: " + session_.SearchText);
+}
+
+void frmSearchPlayer::ClearGrid() {
+  for (int row = 0; row < grdShow.Rows(); ++row) {
+    for (int column = 0; column < grdShow.Cols(); ++column) grdShow.SetCell(row, column, "");
+  }
+}
+
+void frmSearchPlayer::cmdClip_Click() {
+  context_.platform.clipboard.Clear();
+  TabbedText text;
+  for (int row = 0; row < grdShow.Rows(); ++row) {
+    std::vector<std::string> cells;
+    for (int column = 0; column < kColumns; ++column) {
+      cells.push_back(Trim(grdShow.Cell(row, column)));
+    }
+    text.Row(cells, TabbedText::LastTab::Yes);
+  }
+  context_.platform.clipboard.SetText(text.Text());
+  GoodMessage(context_,
+              Lines({"Your Search results   ", "have been copied to the clipboard    ",
+                     "and can now be pasted as text into your    ",
+                     "favourite spreadsheet or wordprocessor.    ", "",
+                     "Note: When you leave this section,    ", "the Clipboard will be cleared !"}));
+}
+
+}  // namespace marlowbeck

@@ -96,6 +96,7 @@ void GridView::FitColumns() {
   const int cols = table_.columnCount();
   if (cols == 0) return;
   std::vector<int> widths;
+  widths.reserve(static_cast<std::size_t>(cols));
   for (int col = 0; col < cols; ++col) widths.push_back(WidthOfColumn(col));
   const int spare = table_.viewport()->width() - std::accumulate(widths.begin(), widths.end(), 0);
   if (spare >= 0) {

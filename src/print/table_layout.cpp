@@ -19,6 +19,12 @@ double PlaceOf(const ColumnLayout& column, double left, double text_width) {
 
 }  // namespace
 
+TableLayout TableLayout::AllCentred() const {
+  TableLayout centred = *this;
+  for (ColumnLayout& column : centred.columns_) column.stand = Stand::Centred;
+  return centred;
+}
+
 double TableLayout::Width() const {
   double width = 0;
   for (const ColumnLayout& column : columns_) width += column.width;

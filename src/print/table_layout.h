@@ -23,6 +23,9 @@ class TableLayout {
   TableLayout(std::vector<ColumnLayout> columns, double pitch)
       : columns_(std::move(columns)), pitch_(pitch) {}
 
+  /// The same columns with every text in the middle.
+  [[nodiscard]] TableLayout AllCentred() const;
+
   [[nodiscard]] double Width() const;
   [[nodiscard]] double Pitch() const { return pitch_; }
 

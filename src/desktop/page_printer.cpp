@@ -1,5 +1,6 @@
 #include "desktop/page_printer.h"
 
+#include <exception>
 #include <utility>
 
 #include <QApplication>
@@ -12,6 +13,7 @@
 #include <QPrintPreviewDialog>
 #include <QPrinter>
 #include <QPrinterInfo>
+#include <QSaveFile>
 #include <QStandardPaths>
 #include <QUrl>
 
@@ -24,10 +26,8 @@ namespace {
 
 constexpr int kTwipsPerInch = 1440;
 constexpr int kTwipsPerPoint = 20;
-constexpr int kPaperWidth = 11906;  ///< A4, in twips
-constexpr int kPaperHeight = 16838;
-constexpr int kMargin = 360;  ///< that no printer prints on, in twips
-constexpr double kRule = 10;  ///< width of lines, in twips
+constexpr double kMargin = 18;  ///< that no printer prints on, in points
+constexpr double kRule = 10;    ///< width of lines, in twips
 
 }  // namespace
 
@@ -57,41 +57,97 @@ const PrintTarget& PagePrinter::Target() {
 void PagePrinter::SetTarget(const PrintTarget& target) {
   target_ = target;
   target_known_ = true;
+  layout_.reset();
+}
+
+void PagePrinter::SetOrientation(Orientation orientation) {
+  orientation_ = orientation;
+  layout_.reset();
+}
+
+const QPageLayout& PagePrinter::Layout() {
+  if (!layout_) layout_ = FindLayout();
+  return *layout_;
+}
+
+/// A preview shows the paper of the printer that it would be printed on.
+QString PagePrinter::PrinterInUse() {
+  switch (Target().kind) {
+    case PrintTarget::Kind::Printer:
+      return target_.printer;
+    case PrintTarget::Kind::Preview:
+      return QPrinterInfo::defaultPrinterName();
+    case PrintTarget::Kind::Pdf:
+      break;
+  }
+  return {};
+}
+
+/// A printer that cannot be reached is measured as A4: that it is not there comes out at the end.
+QPageLayout PagePrinter::FindLayout() {
+  const auto way =
+      orientation_ == Orientation::Portrait ? QPageLayout::Portrait : QPageLayout::Landscape;
+  const QString name = PrinterInUse();
+  if (!name.isEmpty()) {
+    QPrinter printer(QPrinter::HighResolution);
+    printer.setPrinterName(name);
+    printer.setPageOrientation(way);
+    if (printer.isValid()) return printer.pageLayout();
+  }
+  return {QPageSize(QPageSize::A4), way, QMarginsF(kMargin, kMargin, kMargin, kMargin)};
 }
 
 int PagePrinter::PageWidth() {
-  return (orientation_ == Orientation::Portrait ? kPaperWidth : kPaperHeight) - 2 * kMargin;
+  return qRound(Layout().paintRect(QPageLayout::Point).width() * kTwipsPerPoint);
 }
 
 int PagePrinter::PageHeight() {
-  return (orientation_ == Orientation::Portrait ? kPaperHeight : kPaperWidth) - 2 * kMargin;
+  return qRound(Layout().paintRect(QPageLayout::Point).height() * kTwipsPerPoint);
+}
+
+void PagePrinter::SetFont(const PrinterFont& font) {
+  font_ = font;
+  drawn_ = FontInTwips(font);
 }
 
 double PagePrinter::TextWidth(const std::string& text) {
-  return QFontMetricsF(FontInTwips(font_)).horizontalAdvance(ToQt(text));
+  return QFontMetricsF(drawn_).horizontalAdvance(ToQt(text));
 }
 
 double PagePrinter::TextHeight(const std::string& /*text*/) {
-  return QFontMetricsF(FontInTwips(font_)).height();
+  return QFontMetricsF(drawn_).height();
 }
 
 void PagePrinter::Print(double x, double y, const std::string& text) {
-  pages_.back().emplace_back(TextAt{{x, y}, ToQt(text), font_});
+  present_.emplace_back(TextAt{{x, y}, ToQt(text), drawn_});
 }
 
 void PagePrinter::Line(double x1, double y1, double x2, double y2) {
-  pages_.back().emplace_back(QLineF(x1, y1, x2, y2));
+  present_.emplace_back(QLineF(x1, y1, x2, y2));
 }
 
 void PagePrinter::Box(double x1, double y1, double x2, double y2) {
-  pages_.back().emplace_back(QRectF(QPointF(x1, y1), QPointF(x2, y2)));
+  present_.emplace_back(QRectF(QPointF(x1, y1), QPointF(x2, y2)));
+}
+
+void PagePrinter::NewPage() { TurnPage(); }
+
+void PagePrinter::TurnPage() {
+  OnePage page = std::exchange(present_, {});
+  const bool copy = !pages_.empty() && *pages_.back() == page;
+  pages_.push_back(copy ? pages_.back() : std::make_shared<const OnePage>(std::move(page)));
 }
 
 /// An empty page at the end is no page.
 void PagePrinter::EndDoc() {
-  Pages pages = std::exchange(pages_, Pages(1));
-  if (pages.back().empty()) pages.pop_back();
+  if (!present_.empty()) TurnPage();
+  const Pages pages = std::exchange(pages_, {});
   if (!pages.empty()) Send(pages);
+}
+
+void PagePrinter::KillDoc() {
+  pages_.clear();
+  present_.clear();
 }
 
 void PagePrinter::Send(const Pages& pages) {
@@ -105,14 +161,6 @@ void PagePrinter::Send(const Pages& pages) {
   }
 }
 
-void PagePrinter::SetLayout(QPagedPaintDevice& device) const {
-  const bool upright = orientation_ == Orientation::Portrait;
-  const double points = static_cast<double>(kMargin) / kTwipsPerPoint;
-  device.setPageLayout(QPageLayout(QPageSize(QPageSize::A4),
-                                   upright ? QPageLayout::Portrait : QPageLayout::Landscape,
-                                   QMarginsF(points, points, points, points)));
-}
-
 void PagePrinter::Paint(QPagedPaintDevice& device, const Pages& pages) {
   QPainter painter;
   if (!painter.begin(&device)) throw RunTimeError(ErrorNumber::PrinterOff);
@@ -120,7 +168,7 @@ void PagePrinter::Paint(QPagedPaintDevice& device, const Pages& pages) {
                 static_cast<double>(device.logicalDpiY()) / kTwipsPerInch);
   for (std::size_t i = 0; i < pages.size(); ++i) {
     if (i > 0 && !device.newPage()) throw RunTimeError(ErrorNumber::PrinterOff);
-    for (const Operation& operation : pages[i]) Perform(painter, operation);
+    for (const Operation& operation : *pages[i]) Perform(painter, operation);
   }
   if (!painter.end()) throw RunTimeError(ErrorNumber::PrinterOff);
 }
@@ -128,9 +176,9 @@ void PagePrinter::Paint(QPagedPaintDevice& device, const Pages& pages) {
 void PagePrinter::Perform(QPainter& painter, const Operation& operation) {
   painter.setPen(QPen(Qt::black, kRule));
   if (const auto* text = std::get_if<TextAt>(&operation)) {
-    painter.setFont(FontInTwips(text->font));
+    painter.setFont(text->font);
     // A text stands by its upper left corner.
-    const double ascent = QFontMetricsF(painter.font()).ascent();
+    const double ascent = QFontMetricsF(text->font).ascent();
     painter.drawText(text->place + QPointF(0, ascent), text->text);
   } else if (const auto* line = std::get_if<QLineF>(&operation)) {
     painter.drawLine(*line);
@@ -143,32 +191,46 @@ void PagePrinter::SendToPrinter(const Pages& pages) {
   QPrinter printer(QPrinter::HighResolution);
   printer.setPrinterName(target_.printer);
   if (!printer.isValid()) throw RunTimeError(ErrorNumber::PrinterOff);
-  SetLayout(printer);
+  printer.setPageLayout(Layout());
   Paint(printer, pages);
 }
 
-void PagePrinter::SendToPdf(const Pages& pages) const {
+/// The file is there once it is whole.
+void PagePrinter::SendToPdf(const Pages& pages) {
   const QDir folder(QStandardPaths::writableLocation(QStandardPaths::DocumentsLocation));
   folder.mkpath(".");
   const QString stamp = QDateTime::currentDateTime().toString("yyyy-MM-dd HH.mm.ss.zzz");
   const QString path = folder.filePath("Marlowbeck " + stamp + ".pdf");
-  QPdfWriter writer(path);
-  writer.setResolution(kTwipsPerInch);
-  writer.setTitle("Marlowbeck");
-  SetLayout(writer);
-  Paint(writer, pages);
+  QSaveFile file(path);
+  if (!file.open(QIODevice::WriteOnly)) throw RunTimeError(ErrorNumber::PrinterOff);
+  {
+    QPdfWriter writer(&file);
+    writer.setResolution(kTwipsPerInch);
+    writer.setTitle("Marlowbeck");
+    writer.setPageLayout(Layout());
+    Paint(writer, pages);
+  }
+  if (!file.commit()) throw RunTimeError(ErrorNumber::PrinterOff);
   view_(path);
 }
 
+/// A failure in the middle of the toolkit's own work is told once that is over.
 void PagePrinter::SendToPreview(const Pages& pages) {
   QPrinter printer(QPrinter::HighResolution);
-  SetLayout(printer);
+  printer.setPageLayout(Layout());
   QPrintPreviewDialog preview(&printer, QApplication::activeWindow());
   preview.setWindowTitle("Preview");
-  QObject::connect(&preview, &QPrintPreviewDialog::paintRequested, &preview,
-                   [&](QPrinter* on) { Paint(*on, pages); });
+  std::exception_ptr failure;
+  QObject::connect(&preview, &QPrintPreviewDialog::paintRequested, &preview, [&](QPrinter* on) {
+    try {
+      Paint(*on, pages);
+    } catch (...) {
+      failure = std::current_exception();
+    }
+  });
   preview.resize(800, 560);
   preview.exec();
+  if (failure) std::rethrow_exception(failure);
 }
 
 }  // namespace marlowbeck

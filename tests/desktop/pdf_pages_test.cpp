@@ -1,0 +1,231 @@
+// Printouts as they come out: PDF files turned into pictures, in which a twip and its place are
+// looked for again.
+
+#include <algorithm>
+
+#include <QDir>
+#include <QImage>
+#include <QProcess>
+#include <QStandardPaths>
+#include <QTemporaryDir>
+#include <gtest/gtest.h>
+
+#include "data/real_file_system.h"
+#include "desktop/encoding.h"
+#include "desktop/page_printer.h"
+#include "ladder/print_tables.h"
+#include "print/report.h"
+#include "tests/desktop/still_world.h"
+
+namespace marlowbeck {
+namespace {
+
+constexpr double kMargin = 360;        // twips round what is printed on
+constexpr double kTwipsPerPixel = 10;  // at 144 dots to the inch
+
+/// A page as a picture of grey dots, asked for in twips of the printable area.
+class Picture {
+ public:
+  explicit Picture(QImage image) : image_(std::move(image)) {}
+  [[nodiscard]] bool IsEmpty() const { return image_.isNull(); }
+  [[nodiscard]] QSize Size() const { return image_.size(); }
+  /// The darkest dot of an area is dark, its edges included.
+  [[nodiscard]] bool HasInk(double x1, double y1, double x2, double y2) const {
+    for (int y = Dot(y1); y <= Dot(y2); ++y) {
+      for (int x = Dot(x1); x <= Dot(x2); ++x) {
+        if (image_.valid(x, y) && qGray(image_.pixel(x, y)) < 128) return true;
+      }
+    }
+    return false;
+  }
+  /// Every dot of an upright or level line is dark, give or take one dot to its side.
+  [[nodiscard]] bool HasRule(double x1, double y1, double x2, double y2) const {
+    const int steps = std::max(Dot(x2) - Dot(x1), Dot(y2) - Dot(y1));
+    for (int i = 0; i <= steps; ++i) {
+      const double x = x1 + (x2 - x1) * i / steps;
+      const double y = y1 + (y2 - y1) * i / steps;
+      if (!HasInk(x - kTwipsPerPixel, y - kTwipsPerPixel, x + kTwipsPerPixel, y + kTwipsPerPixel)) {
+        return false;
+      }
+    }
+    return true;
+  }
+
+ private:
+  static int Dot(double twips) { return static_cast<int>((twips + kMargin) / kTwipsPerPixel); }
+  QImage image_;
+};
+
+LadderTab ATab() {
+  return {
+      "A Grade",
+      "A Grade    Wednesday, 17 March 2004 ",
+      "A Grade PREMIERSHIP LADDER up to: Wednesday, 17 March 2004 ",
+      {"Wanderers of the Western Wards", "Ivy", "Rovers"},
+      {{"Wanderers of the Western Wards", "11", " def ", "Ivy", "0"},
+       {"Rovers", "0", " drew ", "", "0"}},
+      {{"Wanderers of the Western Wards", "14", "12", "1", "1", "888", "777", "114.29", "25", "+2"},
+       {"Rovers", "14", "7", "7", "0", "88", "77", "100.00", "14", "0"},
+       {"Ivy", "14", "0", "14", "0", "8", "120", "6.67", "-2", "-2"}}};
+}
+
+class PdfPages : public testing::Test {
+ protected:
+  PdfPages() {
+    QStandardPaths::setTestModeEnabled(true);
+    qputenv("HOME", folder_.path().toUtf8());
+    printer_.SetTarget({PrintTarget::Kind::Pdf, {}});
+    session_.AssociationName = "Marlow and District Darts Association";
+    session_.SeasonFile = "S.qzs";
+    files_.ChangeFolder(working_folder_);
+    QFile season(folder_.filePath("S.qzs"));
+    EXPECT_TRUE(season.open(QIODevice::WriteOnly));
+    season.write("\"Winter 2004\"\r\n");
+  }
+  void TearDown() override { QFile::remove(viewed_); }
+
+  void PrintTab(LadderPrintout what, const PrintOptions& options = {}) {
+    PrintLadderTab(context_, options, what, ATab());
+  }
+  /// The pages of the PDF file that was last handed to the viewer.
+  std::vector<Picture> Pictures() {
+    EXPECT_TRUE(QFile::exists(viewed_));
+    const QString name = folder_.filePath("page");
+    QProcess::execute("pdftoppm", {"-r", "144", "-gray", viewed_, name});
+    std::vector<Picture> pictures;
+    for (const QFileInfo& file :
+         QDir(folder_.path()).entryInfoList({"page*.pgm"}, QDir::Files, QDir::Name)) {
+      pictures.emplace_back(QImage(file.filePath()));
+      Keep(file.filePath(), pictures.size());
+      QFile::remove(file.filePath());
+    }
+    return pictures;
+  }
+  /// Where MARLOWBECK_PICTURES names a folder, pictures stay there to be looked at.
+  static void Keep(const QString& path, std::size_t page) {
+    const QString folder = qEnvironmentVariable("MARLOWBECK_PICTURES");
+    if (folder.isEmpty()) return;
+    const QString test = testing::UnitTest::GetInstance()->current_test_info()->name();
+    QImage(path).save(QDir(folder).filePath(test + QString::number(page) + ".png"));
+  }
+
+  double WidestOf(const std::vector<std::string>& texts) {
+    double widest = 0;
+    for (const std::string& text : texts) widest = std::max(widest, printer_.TextWidth(text));
+    return widest;
+  }
+  /// Distances of the ladder's column edges from its left one, measured anew.
+  std::vector<double> LadderEdges() {
+    std::vector<double> edges = {0, 1.2 * WidestOf(ATab().teams)};
+    for (const char* eights :
+         {"888", "888", "888", "888", "8888", "8888", "8888888", "8888", "888"}) {
+      edges.push_back(edges.back() + 1.2 * printer_.TextWidth(eights));
+    }
+    return edges;
+  }
+
+  QTemporaryDir folder_;
+  std::string working_folder_ = FromQt(folder_.path());
+  QString viewed_;
+  PagePrinter printer_{[this](const QString& path) { viewed_ = path; }};
+  StillWorld world_;
+  Platform platform_{world_.platform.boxes,     world_.platform.dialogs, printer_,
+                     world_.platform.clipboard, world_.platform.sound,   world_.platform.help,
+                     world_.platform.clock,     world_.platform.timer,   world_.platform.display,
+                     world_.platform.observer};
+  RealFileSystem files_;
+  Channels channels_{files_};
+  Session session_;
+  Context context_{session_, channels_, platform_, working_folder_};
+};
+
+TEST_F(PdfPages, LadderOnPaperHasItsRulesWhereTheyWereMeasured) {
+  PrintTab(LadderPrintout::Ladder);
+  const auto pages = Pictures();
+  ASSERT_EQ(pages.size(), 1U);
+  EXPECT_NEAR(pages[0].Size().width(), 1190, 2);
+  EXPECT_NEAR(pages[0].Size().height(), 1684, 2);
+  const double line = printer_.TextHeight("x");
+  const std::vector<double> edges = LadderEdges();
+  const double left = (printer_.PageWidth() - edges.back()) / 2;
+  const double top = 567 + 3 * 1.25 * line + 1.5 * line;
+  for (int row = 0; row <= 4; ++row) {
+    const double y = top + row * 1.2 * line;
+    EXPECT_TRUE(pages[0].HasRule(left, y, left + edges.back(), y)) << "above row " << row;
+  }
+  for (const double edge : edges) {
+    EXPECT_TRUE(pages[0].HasRule(left + edge, top, left + edge, top + 4 * 1.2 * line)) << edge;
+  }
+  EXPECT_FALSE(pages[0].HasInk(0, top - line / 4, left - 30, top + 6 * line)) << "left of it";
+  EXPECT_FALSE(pages[0].HasInk(left + edges.back() + 30, top - line / 4, printer_.PageWidth(),
+                               top + 6 * line))
+      << "right of it";
+}
+
+TEST_F(PdfPages, NoTextTouchesARuleInAnyFont) {
+  for (const char* name : {"MS Sans Serif", "DejaVu Sans Mono", "Liberation Serif"}) {
+    for (const int size : {8, 10, 13}) {
+      session_.PrintFontName = name;
+      session_.PrintFontSize = size;
+      if (std::string(name) == "DejaVu Sans Mono" && size > 8) continue;  // has no room on A4
+      PrintTab(LadderPrintout::Ladder);
+      const auto pages = Pictures();
+      ASSERT_EQ(pages.size(), 1U) << name << size;
+      const double line = printer_.TextHeight("x");
+      const std::vector<double> edges = LadderEdges();
+      const double left = (printer_.PageWidth() - edges.back()) / 2;
+      const double top = 567 + 3 * 1.25 * line + 1.5 * line;
+      for (std::size_t i = 1; i < edges.size(); ++i) {
+        for (int row = 0; row < 4; ++row) {
+          const double y = top + row * 1.2 * line;
+          // Just before the rule, between the row's upper and lower one.
+          EXPECT_FALSE(pages[0].HasInk(left + edges[i] - 25, y + 25, left + edges[i] - 20,
+                                       y + 1.2 * line - 25))
+              << name << size << " row " << row << " column " << i;
+        }
+      }
+    }
+  }
+}
+
+TEST_F(PdfPages, BothTablesAndTheirCopiesComeOut) {
+  PrintTab(LadderPrintout::Both, {1, 2});
+  EXPECT_EQ(Pictures().size(), 2U);
+}
+
+TEST_F(PdfPages, LandscapePaperLiesOnItsSide) {
+  printer_.SetOrientation(Orientation::Landscape);
+  PrintTab(LadderPrintout::Both);
+  const auto pages = Pictures();
+  ASSERT_EQ(pages.size(), 1U);
+  EXPECT_GT(pages[0].Size().width(), pages[0].Size().height());
+}
+
+TEST_F(PdfPages, PlayersOfATeamComeOut) {
+  ReportTable night = {
+      "Rovers  A Grade  (v's  Hawks)  17/03/2004",
+      {{"Player", ""}, {"Agg", "88888"}, {"Sh", "8888"}, {"501", "88888888"}, {"Avg", "8888888"}},
+      {{"Archer, Josephine", "505", "20", "57, 121", "25.25"},
+       {"Li, Bo", "Forfeit", "Win", "", ""}}};
+  PrintReport(context_, {}, {night, night});
+  EXPECT_EQ(Pictures().size(), 1U);
+}
+
+TEST_F(PdfPages, WhatCannotBeWrittenIsAFailureThatLeavesNothing) {
+  const QDir documents(QStandardPaths::writableLocation(QStandardPaths::DocumentsLocation));
+  QDir().mkpath(QFileInfo(documents.path()).path());
+  QDir(documents.path()).removeRecursively();
+  QFile in_the_way(documents.path());
+  ASSERT_TRUE(in_the_way.open(QIODevice::WriteOnly));
+  PrintTab(LadderPrintout::Ladder);
+  EXPECT_EQ(session_.MessageText, "An unrecognised error occurred while trying to print.    ");
+  EXPECT_TRUE(viewed_.isEmpty());
+  in_the_way.remove();
+  session_.MessageText.clear();
+  PrintTab(LadderPrintout::Ladder);
+  EXPECT_TRUE(session_.MessageText.empty());
+  EXPECT_TRUE(QFile::exists(viewed_));
+}
+
+}  // namespace
+}  // namespace marlowbeck

@@ -3,6 +3,7 @@
 #include <tuple>
 
 #include "data/numbers.h"
+#include "data/runtime_error.h"
 #include "data/text.h"
 #include "print/font_settings.h"
 #include "session/messages.h"
@@ -34,7 +35,13 @@ FontBox::FontBox(const Context& context, const Controls& controls)
 }
 
 void FontBox::GetFont() {
-  ReadFontSettings(context_);
+  try {
+    ReadFontSettings(context_);
+  } catch (const RunTimeError&) {
+    // The default holds, though it could not be written.
+    AlignFontBox();
+    throw;
+  }
   AlignFontBox();
 }
 

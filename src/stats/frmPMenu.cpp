@@ -25,8 +25,10 @@ frmPMenu::frmPMenu(Screens& screens, const Context& context)
   imgBall.SetTabStop(false);
   WireMenu();
   WireWeekly();
-  Cancels = {&cmdCancelWK, &Image10};
-  Helps = {&cmdPlrResExit};
+  WirePrinting();
+  Defaults = {&cmdBothOK};
+  Cancels = {&cmdBothCancel, &cmdCancelWK, &Image10};
+  Helps = {&cmdWeekHelp, &cmdPlrResExit};
 }
 
 void frmPMenu::WireMenu() {

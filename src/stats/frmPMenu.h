@@ -4,6 +4,7 @@
 #include <vector>
 
 #include "print/font_box.h"
+#include "print/print_panel.h"
 #include "stats/team_reports.h"
 #include "ui/context.h"
 #include "ui/controls.h"
@@ -73,7 +74,19 @@ struct frmPMenu : Screen {
   Label lblPrFont{fraFontPick, "lblPrFont"};
   Label lblFontInfo{*this, "lblFontInfo", " Click to change font. "};
   Panel picPrint{*this, "picPrint", "Print Options"};
+  Label lblPrinterName{picPrint, "lblPrinterName"};
+  Label lblOrient{picPrint, "lblOrient"};
+  std::array<OptionButton, 3> optBoth = {
+      OptionButton{picPrint, "optBoth(0)", "Weekly details ONLY"},
+      OptionButton{picPrint, "optBoth(1)", "Progressive details ONLY"},
+      OptionButton{picPrint, "optBoth(2)", "Weekly and Progressive details"}};
+  ComboBox cboFromTop{picPrint, "cboFromTop", "How many Centimeters from Top of Page ?",
+                      ComboBox::Typing::Free};
+  TextBox txtNoC{picPrint, "txtNoC", "Number of Copies:"};
   Command cmdWeekHelp{picPrint, "cmdWeekHelp", "Help"};
+  Command cmdPrinterSetup{picPrint, "cmdPrinterSetup", "Printer Setup"};
+  Command cmdBothOK{picPrint, "cmdBothOK", "Print"};
+  Command cmdBothCancel{picPrint, "cmdBothCancel", "Cancel"};
   Panel picPrintHI{*this, "picPrintHI", "Print Options"};
 
   void Load() override;
@@ -110,9 +123,19 @@ struct frmPMenu : Screen {
   void optFFyes_Click();
   void optFFno_Click();
 
+  // Printing of the two tables.
+  void cmdPrintLad_Click();
+  void cmdPrinterSetup_Click();
+  void cmdBothOK_Click();
+  void PrintWeekly();
+  void PrintProg();
+  void PrintBoth();
+
  private:
   void WireMenu();
   void WireWeekly();
+  void WirePrinting();
+  void ClosePrintPanel();
   [[nodiscard]] std::array<Picture*, 11> Entries();
   void TakeSelection();
   void ShowSeason();
@@ -128,6 +151,7 @@ struct frmPMenu : Screen {
 
   const Context& context_;
   Session& session_;
+  PrintPanel print_panel_{context_, {lblPrinterName, lblOrient, txtNoC, &cboFromTop}};
   FontBox font_box_{context_, {fraFontPick, lblFont, lblPrFont, lblFontInfo}};
   TeamReports reports_;
   std::vector<ProgressiveRow> progressive_;  ///< the rows of the last CalcProg

@@ -104,7 +104,7 @@ void WriteWorkDate(Channels& channels, Date date) {
 
 std::string ReadOneString(Channels& channels, const std::string& path) {
   channels.OpenInput(Channel::Side, path);
-  std::string text = channels.Reader(Channel::Side).Text();
+  std::string text = channels.Reader(Channel::Side).TextToLastQuote();
   channels.Close(Channel::Side);
   return text;
 }

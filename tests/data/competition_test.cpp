@@ -156,6 +156,8 @@ TEST_F(Competition, TheWorkDateComesBack) {
 TEST_F(Competition, OneStringComesBackWithItsCommasAndQuotes) {
   WriteOneString(channels, "FileName.qz3", "/club/\"A\" and, B/Winter.qza");
   EXPECT_EQ(ReadOneString(channels, "filename.qz3"), "/club/\"A\" and, B/Winter.qza");
+  WriteOneString(channels, "FileName.qz3", "/club/\"First\", and last/\",Winter\".qza");
+  EXPECT_EQ(ReadOneString(channels, "FileName.qz3"), "/club/\"First\", and last/\",Winter\".qza");
   WriteOneString(channels, "FileName.qz3", "");
   EXPECT_EQ(ReadOneString(channels, "FileName.qz3"), "");
   EXPECT_EQ(folder.Read("FileName.qz3"), "\"\"\r\n");

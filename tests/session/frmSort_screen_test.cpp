@@ -50,6 +50,17 @@ TEST_F(SortOnLeaving, FileOutOfDateOrderIsPutInOrder) {
   EXPECT_FALSE(Loaded("frmSort"));
 }
 
+TEST_F(SortOnLeaving, TheFileOfAGradeWithAQuoteAndACommaIsPutInOrderToo) {
+  const std::string grade = "\"First\", Last";
+  LaySeason(*this, {});
+  WritePlayers("Winter.qza", {Player(1, "Archer", "Jo", "Rovers", grade),
+                              Player(2, "Bull", "Ann", "Hawks", grade)});
+  WriteResults("Winter_" + grade + ".qzr", OutOfOrder());
+  DoAll(kLeaveScoreSheets);
+  EXPECT_TRUE(SameResults(File("Winter_" + grade + ".qzr"), FileOf(InOrder())));
+  EXPECT_FALSE(HasFile("Winter_\"First"));
+}
+
 TEST_F(SortOnLeaving, FileInOrderIsNotSortedAgain) {
   LaySeason(*this, InOrder());
   DoAll(kLeaveScoreSheets);

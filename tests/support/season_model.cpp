@@ -23,9 +23,6 @@ std::string LineOf(const PlayerRecord& player) {
   return Trim(player.Surname) + ", " + Trim(player.FirstName);
 }
 
-/// A slash parts folders, of which there is none by such a name.
-bool NamesAFile(std::string_view grade) { return grade.find('/') == std::string_view::npos; }
-
 /// Moves a grade's file to another name. Answers false where it is not there, or the other one is.
 template <typename Files>
 bool Move(Files& files, const std::string& from, const std::string& to) {
@@ -54,6 +51,11 @@ void RenameIn(std::string& field, std::string_view from, std::string_view to) {
 }
 
 }  // namespace
+
+/// A slash parts folders, of which there is none by such a name.
+bool SeasonModel::NamesAFile(std::string_view grade) {
+  return grade.find('/') == std::string_view::npos;
+}
 
 std::vector<std::string> SeasonModel::Grades() const {
   std::set<std::string> grades;

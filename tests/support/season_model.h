@@ -1,6 +1,8 @@
 #pragma once
 
+#include <array>
 #include <map>
+#include <optional>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -9,6 +11,24 @@
 #include "support/record_files.h"
 
 namespace marlowbeck {
+
+/// A team of a grade on a date.
+struct TeamNight {
+  std::string grade;
+  std::string team;
+  Date date;
+};
+
+/// A night's figures as they are typed; those that are 0 are left blank, but for the first two.
+struct Figures {
+  int aggregate = 0;
+  int shots = 0;
+  int high_score = 0;
+  int centuries = 0;
+  int scores_180 = 0;
+  std::array<int, 6> pegs{};
+  int legs = 0;
+};
 
 /// A competition as plain lists in memory, and what each correction makes of them: the same steps
 /// told a second time, record by record, without files. Texts are as the records hold them, padded;
@@ -45,6 +65,36 @@ class SeasonModel {
   Boxes RenameTeam(std::string_view grade, std::string_view team, std::string_view reply);
   Boxes RenameGrade(std::string_view grade, std::string_view reply);
 
+  // On the score sheets of a team's night.
+
+  /// The teams that stand in no result of the date, without the one in hand.
+  [[nodiscard]] std::vector<std::string> FreeTeams(const TeamNight& at) const;
+  /// The one that is met, else the first that is free, else nobody.
+  [[nodiscard]] std::string OppositionOn(const TeamNight& at) const;
+  /// Whether another opposition is offered.
+  [[nodiscard]] bool CanSwap(const TeamNight& at) const;
+  Boxes SwapOpposition(const TeamNight& at, const std::string& to, bool sure);
+  /// The lines of those who are entered, one for each result.
+  [[nodiscard]] std::vector<std::string> Entered(const TeamNight& at) const;
+  /// Nothing where no saved sheet comes up for a line.
+  std::optional<Boxes> DeleteResult(const TeamNight& at, std::string_view line, bool sure);
+  /// `typed` need not be of the grade in hand.
+  Boxes AddFromSheets(std::string_view grade_in_hand, const Edit& typed);
+  /// The results of a grade are put in the order of their dates.
+  void CloseSheets(std::string_view grade);
+
+  // On the weekly table of a team's night.
+
+  [[nodiscard]] std::vector<Date> Dates(std::string_view grade, std::string_view team) const;
+  /// The first cells of the table, in no order.
+  [[nodiscard]] std::vector<std::string> Rows(const TeamNight& at) const;
+  /// Whether there is a box for a peg, of six from 0 on, when a row is corrected.
+  [[nodiscard]] bool HasPegBox(const TeamNight& at, std::string_view row, std::size_t peg) const;
+  Boxes CorrectScore(const TeamNight& at, std::string_view row, const Figures& typed);
+  Boxes ChangeDate(const TeamNight& at, Date to);
+
+  /// Whether a grade's name can be part of a file's.
+  [[nodiscard]] static bool NamesAFile(std::string_view grade);
   /// Whether the player of a line, when it is edited, is bound to team and grade.
   [[nodiscard]] bool IsBound(std::string_view grade, std::string_view team, std::string_view line);
 
@@ -59,6 +109,10 @@ class SeasonModel {
   void ExpectFiles(const Club& club, const std::string& base) const;
 
  private:
+  [[nodiscard]] const std::vector<ResultRecord>& ResultsOf(std::string_view grade) const;
+  [[nodiscard]] const PlayerRecord* Listed(std::string_view grade, std::string_view team,
+                                           std::string_view line, std::string_view between) const;
+  [[nodiscard]] std::string WeeklyOpposition(const TeamNight& at) const;
   [[nodiscard]] bool GradeIsTaken(std::string_view name) const;
   [[nodiscard]] bool TeamIsTaken(std::string_view name) const;
   [[nodiscard]] std::int32_t CodeOf(std::string_view grade) const;

@@ -50,10 +50,12 @@ void frmNames::PlayerList() {
   OpenPlayers();
   const std::vector<std::string> players = PlayersOf(context_.channels, team, grade);
   context_.channels.CloseAll();
-  for (const std::string& player : players) lstPlayers.AddLine(player);
-  lblHMP.SetCaption(players.empty() ? std::string()
-                                    : "Players: (" + std::to_string(players.size()) +
-                                          ")  Select to Edit or Delete");
+  for (const std::string& player : players) {
+    lstPlayers.AddLine(player);
+    // KEPT: a team without players leaves the number of the one before; a repair would clear it.
+    lblHMP.SetCaption("Players: (" + std::to_string(lstPlayers.Count()) +
+                      ")  Select to Edit or Delete");
+  }
   panTM.SetCaption(team);
   panGR.SetCaption(grade);
 }

@@ -54,6 +54,17 @@ TEST_F(PlayersTest, ATeamIsPickedTogetherWithTheGrade) {
   EXPECT_EQ(Lines("lstPlayers"), TextList{"Dale, Ed"});
 }
 
+TEST_F(PlayersTest, ATeamWithoutPlayersKeepsTheNumberOfTheOneBefore) {
+  OpenSetup({Player(1, "Zoe", "Al", "Rovers", "A Grade"),
+             Player(2, "Cole", "Di", "Rovers", "A Grade"),
+             Player(3, "Dale", "Ed", "Bulls", "B Grade")});
+  Do("pick cboAddTm =Rovers");
+  Do("pick cboAddTm =Bulls");
+  EXPECT_TRUE(Lines("lstPlayers").empty());
+  EXPECT_EQ(Caption("lblHMP"), "Players: (2)  Select to Edit or Delete");
+  EXPECT_EQ(Caption("panTM"), "Bulls");
+}
+
 TEST_F(PlayersTest, APickOfAGradeShowsItsGamesAndGoesToTheNames) {
   OpenSetup(TwoGrades());
   EXPECT_EQ(Caption("lblNoP"), "Triples & Doubles");

@@ -257,6 +257,36 @@ TEST_F(EditScore, NothingStaleOfTheScoreSheetsIsOpenedOrWritten) {
   EXPECT_EQ(InSession("EditRecord"), 0);
 }
 
+TEST_F(EditScore, NothingStaleOfAnEarlierCorrectionIsLeft) {
+  std::vector<PlayerRecord> players = LeaguePlayers();
+  players.push_back(Player(44, "Boyd", "Al", "Bees", "B Grade", 111));
+  ResultRecord forfeit = Night(44, "Bees", "Crows");
+  forfeit.Forfeit = "F";
+  Lay({});
+  WritePlayers(kLeagueFile, players);
+  WriteResults(kBResults, {Night(41, "Bees", "Crows"), forfeit});
+  DoAll({"click imgPrinter", "click Image6", "pick cboResGrade =B Grade", "dblcell grdWeek 1 0"});
+  EXPECT_EQ(Text("txtPlayer"), "Bell, Di");
+  EXPECT_EQ(InSession("Flag"), 41);
+  EXPECT_FALSE(Shown("txtP2"));
+  DoAll({"click Command2", "dblcell grdWeek 2 0"});
+  EXPECT_EQ(Text("txtPlayer"), "Boyd, Al *");
+  ExpectEmptyBoxes();
+  EXPECT_EQ(InSession("EditRecord"), 0);
+  EXPECT_EQ(InSession("Flag"), 0);
+  EXPECT_EQ(InSession("BestOfThree"), 0);
+  EXPECT_TRUE(Shown("txtP2"));
+}
+
+TEST_F(EditScore, AResultOfNumberNoughtIsNotTakenForThatOfAForfeit) {
+  ResultRecord forfeit = Full();
+  forfeit.Forfeit = "F";
+  Open({forfeit, Night(0, "Hawks", "Lions")});
+  EXPECT_EQ(Text("txtPlayer"), "Hill, Al *");
+  ExpectEmptyBoxes();
+  EXPECT_EQ(InSession("EditRecord"), 0);
+}
+
 TEST_F(EditScore, TheFirstOfSeveralResultsStaysTheOneOpened) {
   ResultRecord first = Full();
   ResultRecord last = Full();

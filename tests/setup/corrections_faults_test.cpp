@@ -217,5 +217,38 @@ TEST(CorrectionFaults, ADeletedPlayerWithoutResults) {
                    }});
 }
 
+/// Counts a kind of operation that the last line of a script takes.
+long Done(FileOperation operation, const std::vector<std::string>& lines) {
+  Club club(ModelFaceAlone());
+  Lay(club);
+  OpenTeam(club, "Rovers");
+  for (std::size_t i = 0; i + 1 < lines.size(); ++i) club.Do(lines[i]);
+  const long before = club.Faults().Done(operation);
+  club.Do(lines.back());
+  EXPECT_EQ(club.Count("error"), 0);
+  return club.Faults().Done(operation) - before;
+}
+
+/// Each file is replaced in one step once its new content has reached the disk.
+void ExpectReplaced(int files, const std::vector<std::string>& lines) {
+  SCOPED_TRACE(lines.back());
+  EXPECT_EQ(Done(FileOperation::Rename, lines), files);
+  EXPECT_EQ(Done(FileOperation::Sync, lines), files);
+  EXPECT_EQ(Done(FileOperation::Delete, lines), 0);
+}
+
+TEST(CorrectionFaults, EachFileIsReplacedByOneRenameAndNoneIsDeleted) {
+  ExpectReplaced(3, {"input Rangers", "click cmdEdTeamName"});
+  ExpectReplaced(2, {"pick lstPlayers 1", "answer ok", "click cmdDelName"});
+  ExpectReplaced(1, {"pick cboAddGrd =B Grade", "pick cboAddTm =Bulls", "pick lstPlayers 0",
+                     "answer ok", "click cmdDelName"});
+}
+
+TEST(CorrectionFaults, ARenamedGradeTakesFourRenamesBesidesThatOfThePlayers) {
+  const std::vector<std::string> lines = {"input Premier", "click cmdEdGradeName"};
+  EXPECT_EQ(Done(FileOperation::Rename, lines), 5);
+  EXPECT_EQ(Done(FileOperation::Delete, lines), 0);
+}
+
 }  // namespace
 }  // namespace marlowbeck

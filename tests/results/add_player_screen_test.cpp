@@ -2,6 +2,7 @@
 
 #include "data/text.h"
 #include "support/league.h"
+#include "ui/screens.h"
 
 namespace marlowbeck {
 namespace {
@@ -42,6 +43,17 @@ TEST_F(AddPlayer, ThePanelComesUpWithTheGradeAndTheTeamInHand) {
   EXPECT_EQ(Text("txtAddTm0"), "Hawks");
   EXPECT_EQ(Text("txtAddGrd0"), "A Grade");
   EXPECT_EQ(Focus(), "frmResults.txtAddSn0");
+}
+
+TEST_F(AddPlayer, CaptionsOfThePanel) {
+  Open();
+  const Entries expected = {{"txtAddSn0", "Surname"}, {"txtAddFn0", "First Name"},
+                            {"txtAddTm0", "Team"},    {"txtAddGrd0", "Grade"},
+                            {"cmdAddSave0", "Save"},  {"cmdAddCancel0", "Cancel"},
+                            {"SSCommand1", "Help"},   {"panResAddPlayer", "Add Player"}};
+  for (const auto& [control, caption] : expected) {
+    EXPECT_EQ(ScreensOf().Find("frmResults")->Find(control)->Caption(), caption) << control;
+  }
 }
 
 TEST_F(AddPlayer, TheTeamsAreOutOfReachMeanwhile) {

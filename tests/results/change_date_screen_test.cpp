@@ -2,6 +2,7 @@
 
 #include "data/text.h"
 #include "results/from_reports.h"
+#include "ui/screens.h"
 
 namespace marlowbeck {
 namespace {
@@ -38,6 +39,9 @@ TEST_F(ChangeDate, ShowsTheMatchAndItsDate) {
   EXPECT_EQ(Caption("cmdOK"), "&OK");
   EXPECT_EQ(Caption("cmdCancel"), "&Cancel");
   EXPECT_EQ(Caption("cmdNewDateHelp"), "&Help");
+  const Screen& dialog = *ScreensOf().Find("frmChangeDate");
+  EXPECT_EQ(dialog.Find("OldCal")->Caption(), "From ...");
+  EXPECT_EQ(dialog.Find("NewCal")->Caption(), "To ...");
   EXPECT_EQ(Focus(), "frmChangeDate.cmdCancel");
 }
 

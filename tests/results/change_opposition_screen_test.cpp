@@ -46,6 +46,12 @@ TEST_F(ChangeOpposition, ThePanelComesUpInThePlaceOfTheTeams) {
             "Your selection will be changed for all results on: 31/03/2004");
 }
 
+TEST_F(ChangeOpposition, CaptionsOfTheCommands) {
+  Open(entered);
+  EXPECT_EQ(Caption("cmdSaveOp"), "Save");
+  EXPECT_EQ(Caption("SSCommand3"), "Cancel");
+}
+
 TEST_F(ChangeOpposition, TheFreeTeamsAreOfferedAndTheFirstIsSelected) {
   Open({entered[1]});
   EXPECT_EQ(Lines("cboReDoOpp"), (TextList{"Cubs", "Rovers"}));

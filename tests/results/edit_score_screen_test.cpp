@@ -1,6 +1,7 @@
 // One player's figures put right from the weekly table.
 
 #include "results/from_reports.h"
+#include "ui/screens.h"
 
 namespace marlowbeck {
 namespace {
@@ -75,6 +76,20 @@ TEST_F(EditScore, CaptionsOfTheBoxesAndCommands) {
   EXPECT_EQ(Caption("cmdSave"), "Save");
   EXPECT_EQ(Caption("Command2"), "Cancel");
   EXPECT_EQ(Caption("Command3"), "Help");
+  const Entries expected = {{"txtGrade", "Grade:"},
+                            {"txtTeam", "Team:"},
+                            {"txtOpp", "Opposition:"},
+                            {"txtDate", "Date:"},
+                            {"txtPlayer", "Player:"},
+                            {"txtAgg", "Aggregate:"},
+                            {"txtShots", "Shots:"},
+                            {"txtAvg", "Average:"},
+                            {"txtHS", "Highest Score:"},
+                            {"txtCent", "Total Centuries:"},
+                            {"txtHowMany180s", "Total 180's:"}};
+  for (const auto& [box, caption] : expected) {
+    EXPECT_EQ(ScreensOf().Find("frmEdScore")->Find(box)->Caption(), caption) << box;
+  }
 }
 
 TEST_F(EditScore, ADoubleClickInAnotherColumnDoesNothing) {
@@ -281,7 +296,7 @@ TEST_F(EditScore, NothingStaleOfAnEarlierCorrectionIsLeft) {
 TEST_F(EditScore, AResultOfNumberNoughtIsNotTakenForThatOfAForfeit) {
   ResultRecord forfeit = Full();
   forfeit.Forfeit = "F";
-  Open({forfeit, Night(0, "Hawks", "Lions")});
+  Open({Night(0, "Hawks", "Lions"), forfeit});
   EXPECT_EQ(Text("txtPlayer"), "Hill, Al *");
   ExpectEmptyBoxes();
   EXPECT_EQ(InSession("EditRecord"), 0);

@@ -18,6 +18,16 @@ class EditPlayerTest : public SetupTest {
   }
 };
 
+TEST_F(EditPlayerTest, WhatCanBeDoneWithAPickedPlayer) {
+  OpenSetup(TwoGrades());
+  PickPlayer("Rovers", "Baker, Al");
+  EXPECT_EQ(Caption("fraNamesMenu"), "Edit or Delete a player from file");
+  EXPECT_EQ(Caption("lblEdName"), "Baker, Al");
+  EXPECT_EQ(Caption("cmdEdName"), "Edit");
+  EXPECT_EQ(Caption("cmdDelName"), "Delete");
+  EXPECT_EQ(Caption("cmdCancelDel"), "Cancel");
+}
+
 TEST_F(EditPlayerTest, ThePlayersNamesComeIntoTheBoxes) {
   OpenSetup(TwoGrades());
   Edit("Rovers", "Baker, Al");

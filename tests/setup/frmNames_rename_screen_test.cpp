@@ -105,6 +105,12 @@ TEST_F(RenameTest, TheTeamIsAskedForAndToldInAGoodMessage) {
   EXPECT_EQ(Count("sound"), 0);
 }
 
+TEST_F(RenameTest, CaptionsOfTheCommands) {
+  OpenSetup(TwoGrades());
+  EXPECT_EQ(Caption("cmdEdTeamName"), "Edit Team Name");
+  EXPECT_EQ(Caption("cmdEdGradeName"), "Edit Grade Name");
+}
+
 TEST_F(RenameTest, ThenTheListsAreAsAtTheStart) {
   OpenSetup(TwoGrades());
   TypeNames("Half", "typed");

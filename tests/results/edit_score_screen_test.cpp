@@ -353,6 +353,24 @@ TEST_F(EditScore, TheForfeitBoxStaysWithoutEffect) {
   ExpectSaved(Season());
 }
 
+TEST_F(EditScore, TheHandOverAloneSaysWhoseFiguresTheyAre) {
+  HOLDS_FOR_MODELS_ALONE("the screen is shown past the one that opens it");
+  Lay(Season());
+  ResultRecord night = Night(41, "Bees", "Crows");
+  WriteResults(kBResults, {night});
+  OpenWeekly();
+  WriteFile("qzEdScor.qz3",
+            "\"B Grade\"\r\n\"Bees\"\r\n\"Crows\"\r\n\"31/03/2004\"\r\n\"Bell, Di\"\r\n");
+  ScreensOf().Show("frmEdScore");
+  EXPECT_EQ(Text("txtAgg"), "950");
+  TypeInto({{"txtAgg", "960"}, {"txtLegs", "3"}});
+  Do("click cmdSave");
+  night.Aggregate = 960;
+  night.Legs = 3;
+  EXPECT_TRUE(SameResults(File(kBResults), FileOf(std::vector{night})));
+  ExpectSaved(Season());
+}
+
 TEST_F(EditScore, AGradeWithoutBestOfThreeHasThreePegBoxes) {
   Lay({});
   ResultRecord night = Night(41, "Bees", "Crows");

@@ -37,7 +37,10 @@ bool TextView::ClicksAt(const QWidget& /*on*/, QPoint /*at*/) const {
 
 void TextView::ShowKind() {
   if (box_.isReadOnly() != model_.Locked()) ShowLocked();
-  if (FromQt(box_.text()) != model_.Text()) box_.setText(ToQt(model_.Text()));
+  if (FromQt(box_.text()) == model_.Text()) return;
+  box_.setText(ToQt(model_.Text()));
+  // What nobody types is read from its beginning.
+  if (model_.Locked()) box_.setCursorPosition(0);
 }
 
 /// White is for what can be typed into.

@@ -2,6 +2,8 @@
 
 #include <QApplication>
 #include <QComboBox>
+#include <QLabel>
+#include <QLineEdit>
 #include <QPushButton>
 
 #include "tests/desktop/window_club.h"
@@ -26,8 +28,41 @@ class Looks : public testing::Test {
     return true;
   }
 
+  /// Gives two teams the longest names that there are.
+  void LengthenNames() {
+    club_.DoAll({"click imgPlayers", "pick cboAddTm =Drovers",
+                 "input The Wandering Woolwich Wombats", "click cmdEdTeamName",
+                 "pick cboAddTm =Engineers", "input MMMMMMMMMM WWWWWWWWWW MMMMMMMM",
+                 "click cmdEdTeamName", "click cmdAddCancel", "click imgPrinter", "click Image6",
+                 "pick cboResTeam =The Wandering Woolwich Wombats"});
+  }
+  bool ShowsAll(const char* box) {
+    const QLineEdit& edit = club_.Find<QLineEdit>(box);
+    return edit.fontMetrics().horizontalAdvance(edit.text()) < edit.width() - 8;
+  }
+
   WindowClub club_;
 };
+
+TEST_F(Looks, TheLongestNamesCanBeReadWhereFiguresAreCorrected) {
+  LengthenNames();
+  club_.Do("dblcell grdWeek 1 0");
+  for (const char* box : {"txtPlayer", "txtTeam", "txtOpp", "txtGrade", "txtDate"}) {
+    EXPECT_TRUE(ShowsAll(box)) << box;
+    EXPECT_EQ(club_.Find<QLineEdit>(box).cursorPosition(), 0) << box;
+  }
+  EXPECT_LE(WindowOf("frmEdScore")->width(), 800);
+  EXPECT_LE(WindowOf("frmEdScore")->height(), 600);
+}
+
+TEST_F(Looks, TheLongestNamesBreakWhereADateIsChanged) {
+  LengthenNames();
+  club_.Do("click cmdChangeDate");
+  EXPECT_LE(WindowOf("frmChangeDate")->width(), 800);
+  const QLabel& match = club_.Find<QLabel>("lblTeamS");
+  EXPECT_GT(match.height(), 2 * match.fontMetrics().height() - 4) << "two lines";
+  EXPECT_GE(match.height(), match.heightForWidth(match.width()));
+}
 
 TEST_F(Looks, TheCommandThatEnterGoesToLooksLikeIt) {
   club_.DoAll({"click imgPrinter", "click Image6", "click cmdChangeDate"});

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <algorithm>
 #include <string>
 #include <vector>
 
@@ -46,11 +47,13 @@ class FromReports : public ScoreSheets {
 
   /// The Reports screen cannot be worked while the dialog is open.
   void ExpectReportsOutOfReach(Here here = Here::current()) {
-    for (const Json& screen : Do("screens", here)["screens"]) {
-      if (screen["name"] != "frmPMenu") continue;
-      EXPECT_EQ(screen["visible"], false);
-      EXPECT_EQ(screen["enabled"], false);
-    }
+    const Json loaded = Do("screens", here)["screens"];
+    const auto reports = std::find_if(loaded.begin(), loaded.end(), [](const Json& screen) {
+      return screen["name"] == "frmPMenu";
+    });
+    ASSERT_NE(reports, loaded.end());
+    EXPECT_EQ((*reports)["visible"], false);
+    EXPECT_EQ((*reports)["enabled"], false);
     Refused("pick frmPMenu.lstAllDates 0", here);
     Refused("click frmPMenu.cmdCancelWK", here);
     Refused("close frmPMenu", here);

@@ -3,6 +3,7 @@
 #include <exception>
 #include <utility>
 
+#include <QAction>
 #include <QApplication>
 #include <QDateTime>
 #include <QDesktopServices>
@@ -214,12 +215,25 @@ void PagePrinter::SendToPdf(const Pages& pages) {
   view_(path);
 }
 
+namespace {
+
+/// The paper is turned in the set-up dialog, before a page is laid out on it.
+void LeaveThePaperAsItLies(const QPrintPreviewDialog& preview) {
+  static const QStringList kTurns = {"Portrait", "Landscape", "Page setup"};
+  for (QAction* action : preview.findChildren<QAction*>()) {
+    if (kTurns.contains(action->text())) action->setVisible(false);
+  }
+}
+
+}  // namespace
+
 /// A failure in the middle of the toolkit's own work is told once that is over.
 void PagePrinter::SendToPreview(const Pages& pages) {
   QPrinter printer(QPrinter::HighResolution);
   printer.setPageLayout(Layout());
   QPrintPreviewDialog preview(&printer, QApplication::activeWindow());
   preview.setWindowTitle("Preview");
+  LeaveThePaperAsItLies(preview);
   std::exception_ptr failure;
   QObject::connect(&preview, &QPrintPreviewDialog::paintRequested, &preview, [&](QPrinter* on) {
     try {

@@ -34,9 +34,8 @@ double Page::WidestOf(const std::vector<std::string>& texts) const {
   return widest;
 }
 
-void Page::PrintCentred(std::string_view text) {
-  const std::string line = Trim(text);
-  if (line.empty()) return;
+void Page::PrintCentred(const std::string& line) {
+  if (Trimmed(line).empty()) return;
   PrintAt(Middle() - WidthOf(line) / 2, y_, line);
   MoveDown(TextHeight());
 }

@@ -37,8 +37,8 @@ class Page {
   [[nodiscard]] double Y() const { return y_; }
   void MoveTo(double y) { y_ = y; }
   void MoveDown(double distance) { y_ += distance; }
-  /// Prints a line, trimmed, centred on the page, and moves below it. An empty one takes no room.
-  void PrintCentred(std::string_view text);
+  /// Prints a line centred on the page, and moves below it. One of blanks takes no room.
+  void PrintCentred(const std::string& line);
 
   void PrintAt(double x, double y, const std::string& text) { printer_.Print(x, y, text); }
   void Line(double x1, double y1, double x2, double y2) { printer_.Line(x1, y1, x2, y2); }

@@ -63,14 +63,14 @@ class Report {
   void PrintHeading() {
     for (const std::string& line : {session_.AssociationName, session_.SeasonDescription}) {
       if (Trimmed(line).empty()) continue;
-      page_.PrintCentred(line);
+      page_.PrintCentred(Trim(line));
       page_.MoveDown(HalfALine());
     }
   }
 
   void PrintTitle(const std::string& title) {
     page_.SetBold(true);
-    page_.PrintCentred(title);
+    page_.PrintCentred(Trim(title));
     page_.RestoreBold();
     page_.MoveDown(HalfALine());
   }

@@ -70,6 +70,9 @@ void frmPMenu::Load() {
   GetPlayerFileName();
 }
 
+/// Another screen may have chosen another font.
+void frmPMenu::Activate() { font_box_.AlignFontBox(); }
+
 void frmPMenu::Unload() {
   try {
     if (session_.WorkDate.IsSet()) {

@@ -90,6 +90,7 @@ struct frmPMenu : Screen {
   Panel picPrintHI{*this, "picPrintHI", "Print Options"};
 
   void Load() override;
+  void Activate() override;
   void Unload() override;
 
   // The menu.

@@ -3,11 +3,16 @@
 
 #include <algorithm>
 
+#include <QAction>
+#include <QApplication>
 #include <QDir>
 #include <QImage>
+#include <QPrintPreviewDialog>
+#include <QPrintPreviewWidget>
 #include <QProcess>
 #include <QStandardPaths>
 #include <QTemporaryDir>
+#include <QTimer>
 #include <gtest/gtest.h>
 
 #include "data/real_file_system.h"
@@ -82,7 +87,9 @@ class PdfPages : public testing::Test {
     EXPECT_TRUE(season.open(QIODevice::WriteOnly));
     season.write("\"Winter 2004\"\r\n");
   }
-  void TearDown() override { QFile::remove(viewed_); }
+  void TearDown() override {
+    if (!viewed_.isEmpty()) QFile::remove(viewed_);
+  }
 
   void PrintTab(LadderPrintout what, const PrintOptions& options = {}) {
     PrintLadderTab(context_, options, what, ATab());
@@ -209,6 +216,48 @@ TEST_F(PdfPages, PlayersOfATeamComeOut) {
        {"Li, Bo", "Forfeit", "Win", "", ""}}};
   PrintReport(context_, {}, {night, night});
   EXPECT_EQ(Pictures().size(), 1U);
+}
+
+TEST_F(PdfPages, APreviewShowsTheSamePages) {
+  printer_.SetTarget({PrintTarget::Kind::Preview, {}});
+  int pages = 0;
+  QTimer::singleShot(200, qApp, [&pages] {
+    auto* const dialog = dynamic_cast<QPrintPreviewDialog*>(QApplication::activeModalWidget());
+    ASSERT_NE(dialog, nullptr);
+    auto* const preview = dialog->findChild<QPrintPreviewWidget*>();
+    pages = preview->pageCount();
+    int turns = 0;
+    for (const QAction* action : dialog->findChildren<QAction*>()) {
+      const bool turns_paper =
+          QStringList{"Portrait", "Landscape", "Page setup"}.contains(action->text());
+      if (!turns_paper) continue;
+      ++turns;
+      EXPECT_FALSE(action->isVisible()) << action->text().toStdString();
+    }
+    EXPECT_EQ(turns, 3);
+    const QString folder = qEnvironmentVariable("MARLOWBECK_PICTURES");
+    if (!folder.isEmpty()) dialog->grab().save(QDir(folder).filePath("preview.png"));
+    dialog->reject();
+  });
+  PrintTab(LadderPrintout::Both, {1, 3});
+  EXPECT_EQ(pages, 3);
+  EXPECT_TRUE(viewed_.isEmpty()) << "no file is made";
+  EXPECT_TRUE(session_.MessageText.empty());
+}
+
+TEST_F(PdfPages, APrinterThatIsNotThereIsAFailure) {
+  printer_.SetTarget({PrintTarget::Kind::Printer, "No such printer"});
+  PrintTab(LadderPrintout::Ladder);
+  EXPECT_EQ(session_.MessageText, "An unrecognised error occurred while trying to print.    ");
+}
+
+TEST_F(PdfPages, ThousandsOfCopiesAreKeptOnce) {
+  PrintTab(LadderPrintout::Both, {1, 500});
+  EXPECT_LT(QFileInfo(viewed_).size(), 20'000'000);
+  QProcess pages;
+  pages.start("pdfinfo", {viewed_});
+  pages.waitForFinished();
+  EXPECT_TRUE(pages.readAllStandardOutput().contains("Pages:           500"));
 }
 
 TEST_F(PdfPages, WhatCannotBeWrittenIsAFailureThatLeavesNothing) {

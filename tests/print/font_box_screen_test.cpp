@@ -52,7 +52,7 @@ TEST_F(FontBoxScreen, ClickOpensTheDialogWithTheFontAsItIsAndHidesTheHint) {
   Do("hover lblFont");
   Choose("14 0 1 Liberation Sans");
   EXPECT_FALSE(Shown("lblFontInfo"));
-  EXPECT_EQ(EventsNamed("font")[0], Json::parse(R"({"size": 12, "name": "Liberation Serif",
+  EXPECT_EQ(EventsNamed("font").at(0), Json::parse(R"({"size": 12, "name": "Liberation Serif",
       "bold": true, "italic": false, "answer": {"size": 14, "name": "Liberation Sans",
       "bold": false, "italic": true}})"));
 }
@@ -97,7 +97,7 @@ TEST_F(FontBoxScreen, SizeTwentyFiveIsRefusedAndTheOldOneComesBack) {
   Open("12,\"MS Sans Serif\",#FALSE#,#FALSE#\r\n");
   Choose("25 1 0 Liberation Serif");
   EXPECT_EQ(BoxTexts(), std::vector<std::string>{kTooLarge});
-  EXPECT_EQ(Boxes()[0].style, 48);
+  EXPECT_EQ(Boxes().at(0).style, 48);
   EXPECT_EQ(Caption("lblPrFont"), "Font size = 12pts.");
   // Only the size is refused.
   ExpectKept("12,\"Liberation Serif\",#TRUE#,#FALSE#");

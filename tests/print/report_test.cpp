@@ -165,8 +165,8 @@ TEST_F(Report, FurtherDownThanOneCentimetreAsksForTheHeading) {
   Do("answer yes");
   const PrintedPage page = OnePage();
   ASSERT_EQ(Boxes().size(), 1U);
-  EXPECT_EQ(Boxes()[0].style, 67);
-  EXPECT_EQ(Boxes()[0].text,
+  EXPECT_EQ(Boxes().at(0).style, 67);
+  EXPECT_EQ(Boxes().at(0).text,
             "Printing will start 2.7 centimetres from the top of the page.    \r"
             "\r"
             "Do you want to print the Association name and season description ?    \r"
@@ -241,14 +241,14 @@ TEST_F(Report, OneRowMoreIsRefused) {
   Print();
   ExpectThrownAway(kTooLong);
   // It is thrown away before anything is said.
-  EXPECT_TRUE(Events()[0].contains("killed"));
+  EXPECT_TRUE(Events().at(0).contains("killed"));
 }
 
 TEST_F(Report, AllCopiesAreOneDocumentOfEqualPages) {
   options_.copies = 3;
   Print();
   ASSERT_EQ(Pages().size(), 3U);
-  const Json pages = EventsNamed("printed")[0]["pages"];
+  const Json pages = EventsNamed("printed").at(0)["pages"];
   EXPECT_EQ(pages[1], pages[2]);
   EXPECT_EQ(Pages()[0].Words(), Pages()[1].Words());
 }

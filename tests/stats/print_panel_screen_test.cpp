@@ -104,7 +104,7 @@ TEST_F(PrintPanelScreen, NothingSelectedComesBeforeAllOtherChecks) {
   OpenPanel();
   DoAll({"type cboFromTop 0", "type txtNoC 0"});
   ExpectRefusal(kNothing);
-  EXPECT_EQ(Boxes()[0].style, 48);
+  EXPECT_EQ(Boxes().at(0).style, 48);
 }
 
 TEST_F(PrintPanelScreen, DistancesBelowOneAreRefusedBeforeTheCopiesAreLookedAt) {
@@ -136,7 +136,7 @@ TEST_F(PrintPanelScreen, AnyDistanceMayBeTyped) {
   OpenPanel();
   DoAll({"type cboFromTop 2.7", "answer yes"});
   const PrintedPage page = Print(0);
-  EXPECT_TRUE(BoxTexts()[0].starts_with("Printing will start 2.7 centimetres from the top"));
+  EXPECT_TRUE(BoxTexts().at(0).starts_with("Printing will start 2.7 centimetres from the top"));
   ExpectAt(page.Find("Marlow Darts"), 5953 - 600, 2.7 * 567);
 }
 
@@ -246,7 +246,7 @@ TEST_F(PrintPanelScreen, ATeamOfThirtyOnALargeFontHasNoRoomOnAPage) {
   OpenWeekly();
   DoAll({"printer width 20000", "click cmdPrintLad", "click optBoth(0)", "click cmdBothOK"});
   ASSERT_EQ(BoxTexts().size(), 1U);
-  EXPECT_TRUE(BoxTexts()[0].starts_with("Your selections will not fit on one page.   \r"));
+  EXPECT_TRUE(BoxTexts().at(0).starts_with("Your selections will not fit on one page.   \r"));
   EXPECT_EQ(Count("printed"), 0);
   EXPECT_EQ(Count("killed"), 1);
 }

@@ -34,6 +34,7 @@ class Picture {
   explicit Picture(QImage image) : image_(std::move(image)) {}
   [[nodiscard]] bool IsEmpty() const { return image_.isNull(); }
   [[nodiscard]] QSize Size() const { return image_.size(); }
+  [[nodiscard]] const QImage& Image() const { return image_; }
   /// The darkest dot of an area is dark, its edges included.
   [[nodiscard]] bool HasInk(double x1, double y1, double x2, double y2) const {
     for (int y = Dot(y1); y <= Dot(y2); ++y) {
@@ -114,6 +115,13 @@ class PdfPages : public testing::Test {
     if (folder.isEmpty()) return;
     const QString test = testing::UnitTest::GetInstance()->current_test_info()->name();
     QImage(path).save(QDir(folder).filePath(test + QString::number(page) + ".png"));
+  }
+
+  static void KeepUpperPart(const Picture& page, const QString& name) {
+    const QString folder = qEnvironmentVariable("MARLOWBECK_PICTURES");
+    if (folder.isEmpty()) return;
+    const QImage part = page.Image().copy(0, 0, page.Size().width(), page.Size().width() * 2 / 5);
+    part.scaledToWidth(800, Qt::SmoothTransformation).save(QDir(folder).filePath(name));
   }
 
   double WidestOf(const std::vector<std::string>& texts) {
@@ -198,6 +206,27 @@ TEST_F(PdfPages, NoTextTouchesARuleInAnyFont) {
 TEST_F(PdfPages, BothTablesAndTheirCopiesComeOut) {
   PrintTab(LadderPrintout::Both, {1, 2});
   EXPECT_EQ(Pictures().size(), 2U);
+}
+
+/// The upper part of a page, for the manual.
+TEST_F(PdfPages, TheManualShowsSuchAPage) {
+  session_.AssociationName = "Millbrook and District Darts Association";
+  PrintLadderTab(
+      context_, {}, LadderPrintout::Both,
+      {"A Grade",
+       "A Grade    Wednesday, 31 March 2004 ",
+       "A Grade PREMIERSHIP LADDER up to: Wednesday, 31 March 2004 ",
+       {"Anchors", "Bluebells", "Cricketers", "Drovers"},
+       {{"Anchors", "7", " def ", "Bluebells", "4"}, {"Cricketers", "5", " drew ", "Drovers", "5"}},
+       {{"Anchors", "4", "3", "1", "0", "26", "18", "144.44", "6", "0"},
+        {"Drovers", "4", "2", "1", "1", "23", "20", "115.00", "5", "0"},
+        {"Cricketers", "4", "1", "2", "1", "20", "23", "86.96", "3", "0"},
+        {"Bluebells", "4", "1", "3", "0", "17", "25", "68.00", "0", "-2"}}});
+  const auto pages = Pictures();
+  ASSERT_EQ(pages.size(), 1U);
+  const double line = printer_.TextHeight("x");
+  EXPECT_TRUE(pages[0].HasInk(3000, 567, 8000, 567 + line)) << "the association's name";
+  KeepUpperPart(pages[0], "printed-page.png");
 }
 
 TEST_F(PdfPages, LandscapePaperLiesOnItsSide) {

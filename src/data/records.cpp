@@ -186,4 +186,7 @@ std::string_view ResultView::Team() const { return Trimmed(ReadText(bytes_, 4, 3
 std::string_view ResultView::Opposition() const { return Trimmed(ReadText(bytes_, 34, 30)); }
 bool ResultView::IsForfeit() const { return Trimmed(ReadText(bytes_, 92, 30)) == "F"; }
 
+std::string_view LadderView::HomeTeam() const { return Trimmed(ReadText(bytes_, 0, 30)); }
+std::string_view LadderView::AwayTeam() const { return Trimmed(ReadText(bytes_, 30, 30)); }
+
 }  // namespace marlowbeck

@@ -217,4 +217,23 @@ class ResultView {
   Bytes bytes_;
 };
 
+/// A ladder record read in place, as PlayerView.
+class LadderView {
+ public:
+  explicit LadderView(Bytes bytes) : bytes_(bytes) {}
+  [[nodiscard]] std::string_view HomeTeam() const;
+  [[nodiscard]] std::string_view AwayTeam() const;
+  [[nodiscard]] std::int16_t HomeScore() const { return ReadInteger(bytes_, 60); }
+  [[nodiscard]] std::int16_t AwayScore() const { return ReadInteger(bytes_, 62); }
+  [[nodiscard]] std::int16_t HomePenalty() const { return ReadInteger(bytes_, 64); }
+  [[nodiscard]] std::int16_t AwayPenalty() const { return ReadInteger(bytes_, 66); }
+  [[nodiscard]] Date GameDate() const { return ReadDate(bytes_, 72); }
+  /// The two names as they lie in the record, padding included.
+  [[nodiscard]] Bytes HomeField() const { return bytes_.first(30); }
+  [[nodiscard]] Bytes AwayField() const { return bytes_.subspan(30, 30); }
+
+ private:
+  Bytes bytes_;
+};
+
 }  // namespace marlowbeck

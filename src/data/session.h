@@ -44,6 +44,12 @@ struct Session {
   Integer FinalsTeams;
   Integer GamesPerMatch;
 
+  Date LadderDate;           ///< up to which the ladder is shown
+  std::string SelectedHome;  ///< the teams picked for the match in hand
+  std::string SelectedAway;
+  Integer TeamCount;           ///< teams of the grade in hand, on the ladder
+  std::vector<Date> DateList;  ///< the distinct dates of the ladder file
+
   std::string SearchText;  ///< upper-cased part of a surname to look for
 
   bool Quiet = false;  ///< warnings of a guard are held back (score sheets)
@@ -51,7 +57,7 @@ struct Session {
   int ReportChoice = 0;         ///< which entry of the Reports menu is open
   std::string Opposition;       ///< the opposing team of the date in hand (reports)
   std::vector<Date> TeamDates;  ///< the distinct dates of the team or grade in hand
-  Integer DateCount;            ///< how many they are
+  Integer DateCount;            ///< how many they are, or those of the ladder
   Integer RowCount;             ///< rows of the table in hand
 
   std::int32_t PrintFontSize = 10;  ///< whole points

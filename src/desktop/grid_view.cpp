@@ -18,6 +18,10 @@ constexpr const char* kHeadingColumn = "headingColumn";
 /// A property of the form: how many rows are seen, as far as there are that many, in the smallest
 /// window.
 constexpr const char* kLeastRows = "leastRows";
+/// A property of the form: the first row is one like the others, and there is no heading.
+constexpr const char* kHeadless = "headless";
+/// A property of the form: the room is parted among the columns in these shares.
+constexpr const char* kColumnShares = "columnShares";
 
 constexpr int kRowHeight = 24;  // pixels
 constexpr int kAir = 8;         ///< between columns, at the least
@@ -55,13 +59,17 @@ std::string TextOf(const Item* item) {
 }  // namespace
 
 GridView::GridView(Grid& control, QTableWidget* table, Windows& windows)
-    : CaptionedView(control, table, windows), model_(control), table_(*table) {
+    : CaptionedView(control, table, windows),
+      model_(control),
+      table_(*table),
+      heading_rows_(table->property(kHeadless).toBool() ? 0 : 1) {
   table_.setItemDelegate(new RuledDelegate(table));
   table_.setShowGrid(false);
   table_.setAlternatingRowColors(true);
   table_.setEditTriggers(QAbstractItemView::NoEditTriggers);
   table_.setSelectionBehavior(QAbstractItemView::SelectRows);
-  table_.setSelectionMode(QAbstractItemView::SingleSelection);
+  table_.setSelectionMode(heading_rows_ == 0 ? QAbstractItemView::NoSelection
+                                             : QAbstractItemView::SingleSelection);
   table_.setHorizontalScrollMode(QAbstractItemView::ScrollPerPixel);
   table_.verticalHeader()->hide();
   table_.verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
@@ -95,6 +103,7 @@ void GridView::ShowKind() {
 void GridView::FitColumns() {
   const int cols = table_.columnCount();
   if (cols == 0) return;
+  if (table_.property(kColumnShares).isValid()) return ShareOutColumns();
   std::vector<int> widths;
   widths.reserve(static_cast<std::size_t>(cols));
   for (int col = 0; col < cols; ++col) widths.push_back(WidthOfColumn(col));
@@ -109,8 +118,34 @@ void GridView::FitColumns() {
   FitRows();
 }
 
+/// A column of figures is no narrower than they are; the others part what is left.
+void GridView::ShareOutColumns() {
+  const QStringList shares = table_.property(kColumnShares).toString().split(',');
+  const int cols = std::min(table_.columnCount(), static_cast<int>(shares.size()));
+  const auto share = [&](int col) { return shares[col].toInt(); };
+  int widest = 0;
+  int all = 0;
+  for (int col = 0; col < cols; ++col) {
+    widest = std::max(widest, share(col));
+    all += share(col);
+  }
+  int room = table_.viewport()->width();
+  int parts = all;
+  for (int col = 0; col < cols; ++col) {
+    if (share(col) == widest) continue;
+    const int width = std::max(WidthOfColumn(col), table_.viewport()->width() * share(col) / all);
+    table_.setColumnWidth(col, width);
+    room -= width;
+    parts -= share(col);
+  }
+  for (int col = 0; col < cols; ++col) {
+    if (share(col) == widest) table_.setColumnWidth(col, room * widest / parts);
+  }
+  FitRows();
+}
+
 int GridView::WidthOfColumn(int col) const {
-  const int heading = table_.horizontalHeader()->sectionSizeHint(col);
+  const int heading = heading_rows_ == 0 ? 0 : table_.horizontalHeader()->sectionSizeHint(col);
   return std::max(heading, AsView().sizeHintForColumn(col)) + kAir;
 }
 
@@ -128,7 +163,8 @@ int GridView::LeastWidthOfNames() const {
 
 /// A row is as high as its name takes.
 void GridView::FitRows() {
-  int height = 2 * table_.frameWidth() + table_.horizontalHeader()->sizeHint().height();
+  int height = 2 * table_.frameWidth();
+  if (heading_rows_ > 0) height += table_.horizontalHeader()->sizeHint().height();
   const int least_rows = table_.property(kLeastRows).toInt();
   int least = height;
   for (int row = 0; row < table_.rowCount(); ++row) {
@@ -149,7 +185,7 @@ bool GridView::eventFilter(QObject* watched, QEvent* event) {
 
 void GridView::ShowHeading() {
   table_.setColumnCount(model_.Cols());
-  table_.horizontalHeader()->setHidden(model_.Rows() == 0);
+  table_.horizontalHeader()->setHidden(model_.Rows() == 0 || heading_rows_ == 0);
   for (int col = 0; col < model_.Cols(); ++col) {
     auto* const item = new QTableWidgetItem(ToQt(model_.Cell(0, col)));
     item->setTextAlignment(AlignmentOf(col));
@@ -158,23 +194,23 @@ void GridView::ShowHeading() {
 }
 
 void GridView::ShowCells() {
-  table_.setRowCount(std::max(model_.Rows() - 1, 0));
-  for (int row = 1; row < model_.Rows(); ++row) {
+  table_.setRowCount(std::max(model_.Rows() - heading_rows_, 0));
+  for (int row = heading_rows_; row < model_.Rows(); ++row) {
     for (int col = 0; col < model_.Cols(); ++col) {
       auto* const item = new QTableWidgetItem(ToQt(model_.Cell(row, col)));
       item->setTextAlignment(AlignmentOf(col));
-      table_.setItem(row - 1, col, item);
+      table_.setItem(row - heading_rows_, col, item);
     }
   }
 }
 
 void GridView::ShowCurrent() {
   table_.setProperty(kHeadingColumn, model_.Col());
-  if (model_.Row() == 0) {
+  if (model_.Row() < heading_rows_) {
     table_.setCurrentCell(-1, -1);
     table_.clearSelection();
   } else {
-    table_.setCurrentCell(model_.Row() - 1, model_.Col());
+    table_.setCurrentCell(model_.Row() - heading_rows_, model_.Col());
   }
 }
 
@@ -192,7 +228,7 @@ void GridView::ReadKind(ControlState& state) const {
     for (int col = 0; col < cols; ++col) line.push_back(TextOf(table_.item(row, col)));
   }
   state.cols = cols;
-  state.row = table_.currentRow() + 1;
+  state.row = std::max(table_.currentRow() + heading_rows_, 0);
   state.col =
       table_.currentRow() < 0 ? table_.property(kHeadingColumn).toInt() : table_.currentColumn();
 }
@@ -202,7 +238,7 @@ bool GridView::Pressed(const QWidget& on, const QMouseEvent& event) {
   const QPoint place = event.position().toPoint();
   if (&on == table_.viewport()) {
     const QModelIndex index = table_.indexAt(place);
-    if (index.isValid()) PressCell(index.row() + 1, index.column());
+    if (index.isValid()) PressCell(index.row() + heading_rows_, index.column());
     return true;
   }
   const auto& header = *table_.horizontalHeader();

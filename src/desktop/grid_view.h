@@ -27,6 +27,7 @@ class GridView : public CaptionedView {
   void ShowHeading();
   bool eventFilter(QObject* watched, QEvent* event) override;
   void FitColumns();
+  void ShareOutColumns();
   void FitRows();
   /// A table hides its measures, which are every view's.
   [[nodiscard]] const QAbstractItemView& AsView() const { return table_; }
@@ -38,6 +39,7 @@ class GridView : public CaptionedView {
 
   Grid& model_;
   QTableWidget& table_;
+  int heading_rows_;  ///< 1, or 0 in a table without a heading
   std::vector<std::vector<std::string>> shown_cells_;
   int shown_figures_from_ = -1;
 };

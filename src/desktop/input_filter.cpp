@@ -196,10 +196,11 @@ bool InputFilter::MousePress(QObject& watched, ScreenWindow& window, const QMous
     return true;
   }
   if (event.button() != Qt::LeftButton) return false;
-  pressed_ = &control;
   clicked_ = &control;
-  const auto* const widget = static_cast<const QWidget*>(&watched);
-  return view->Pressed(*widget, event);
+  const auto& widget = static_cast<const QWidget&>(watched);
+  // A line that goes as it is picked leaves the button to come up beside the lines.
+  if (view->ClicksAt(widget, event.position().toPoint())) pressed_ = &control;
+  return view->Pressed(widget, event);
 }
 
 /// The second press of a double click is no second click, and nothing to what has come up in the

@@ -29,8 +29,8 @@ class InputFilter : public QObject {
   void FinishTyping();
 
   Windows& windows_;
-  bool swallowing_ = false;  ///< until the button that lost its click is up again
-  const Control* pressed_ = nullptr;
+  bool swallowing_ = false;           ///< until the button that lost its click is up again
+  const Control* pressed_ = nullptr;  ///< where a click as a whole may end
   const Control* clicked_ = nullptr;  ///< by the last press, which may begin a double click
 };
 

@@ -6,8 +6,8 @@
 #include <string>
 #include <vector>
 
+#include "data/date_steps.h"
 #include "data/records.h"
-#include "results/date_steps.h"
 #include "results/score_boxes.h"
 #include "ui/context.h"
 #include "ui/controls.h"

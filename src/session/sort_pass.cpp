@@ -14,20 +14,23 @@ namespace {
 /// Small enough to stay in the processor's cache between reading and writing.
 constexpr std::size_t kBlockRecords = 1024;
 
-/// The results as they lie on disk, and the date of each.
+/// The records as they lie on disk, and the date of each.
 struct Season {
+  std::size_t record_length = 0;
   std::vector<std::byte> records;
   std::vector<double> dates;
 };
 
-Season ReadSeason(Channels& channels, const std::function<void(int)>& moved) {
+Season ReadSeason(Channels& channels, std::size_t date_offset,
+                  const std::function<void(int)>& moved) {
   const auto count = static_cast<std::size_t>(int{channels.RecordCount(Channel::Results)});
   Season season;
-  season.records.reserve(count * kResultLength);
+  season.record_length = channels.RecordLength(Channel::Results);
+  season.records.reserve(count * season.record_length);
   season.dates.reserve(count);
   channels.ForEachRecord(Channel::Results, [&](Bytes record, int number) {
     season.records.insert(season.records.end(), record.begin(), record.end());
-    season.dates.push_back(ResultView(record).GameDate().days);
+    season.dates.push_back(ReadDate(record, date_offset).days);
     moved(number);
   });
   return season;
@@ -84,15 +87,15 @@ std::vector<std::size_t> DateOrder(const std::vector<double>& dates) {
 
 /// Writes the records in that order, a block at a time.
 void WriteInOrder(Channels& channels, const Season& season, std::span<const std::size_t> order) {
+  const std::size_t length = season.record_length;
   std::vector<std::byte> block;
-  block.reserve(std::min(order.size(), kBlockRecords) * kResultLength);
+  block.reserve(std::min(order.size(), kBlockRecords) * length);
   for (std::size_t first = 0; first < order.size(); first += kBlockRecords) {
     block.clear();
     for (const std::size_t record :
          order.subspan(first).first(std::min(kBlockRecords, order.size() - first))) {
-      const auto from =
-          season.records.begin() + static_cast<std::ptrdiff_t>(record * kResultLength);
-      block.insert(block.end(), from, from + kResultLength);
+      const auto from = season.records.begin() + static_cast<std::ptrdiff_t>(record * length);
+      block.insert(block.end(), from, from + static_cast<std::ptrdiff_t>(length));
     }
     channels.PutRun(Channel::Side, static_cast<int>(first) + 1, block);
   }
@@ -100,16 +103,22 @@ void WriteInOrder(Channels& channels, const Season& season, std::span<const std:
 
 }  // namespace
 
-void SortResults(Channels& channels, const std::string& results_file, const std::string& work_file,
-                 const std::function<void(int record)>& moved) {
-  channels.OpenRandom(Channel::Results, results_file, kResultLength);
-  const Season season = ReadSeason(channels, moved);
+void SortByDate(Channels& channels, const DatedFile& file, const std::string& work_file,
+                const std::function<void(int record)>& moved) {
+  channels.OpenRandom(Channel::Results, file.path, file.record_length);
+  const Season season = ReadSeason(channels, file.date_offset, moved);
   channels.CloseAll();
   const std::vector<std::size_t> order = DateOrder(season.dates);
-  channels.OpenRandom(Channel::Side, work_file, kResultLength);
+  channels.OpenRandom(Channel::Side, work_file, file.record_length);
   WriteInOrder(channels, season, order);
   channels.CloseAll();
-  channels.Files().Replace(work_file, results_file);
+  channels.Files().Replace(work_file, file.path);
+}
+
+void SortResults(Channels& channels, const std::string& results_file, const std::string& work_file,
+                 const std::function<void(int record)>& moved) {
+  constexpr Field kGameDate = FieldNamed(kResultFields, "GameDate");
+  SortByDate(channels, {results_file, kResultLength, kGameDate.offset}, work_file, moved);
 }
 
 }  // namespace marlowbeck

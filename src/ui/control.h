@@ -116,6 +116,7 @@ class Control {
   Handler MouseMove;
   Handler MouseUp;  ///< the button has come up over a list, after what the click did
   Handler KeyUp;    ///< a key has come up in a list
+  Handler Entered;  ///< Enter in an entry box, in the place of a Tab
 
   /// Runs a handler of this control, if there is one, through the dispatcher.
   void Fire(const Handler& handler) const;

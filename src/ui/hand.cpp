@@ -366,6 +366,7 @@ void Hand::PressEnter(Control* focus, Screen& front) {
         return focus->Fire(focus->Click);
       case Kind::Text:
       case Kind::Combo:
+        if (focus->Entered) return focus->Fire(focus->Entered);
         // Enter in an entry box is a Tab.
         if (Control* const next = front.NextStop(false)) next->SetFocus();
         return;

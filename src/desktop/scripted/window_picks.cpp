@@ -34,6 +34,9 @@ QPoint CellOf(const QTableWidget& table, int row, int col) {
   return CentreOf(table, table.model()->index(row, col));
 }
 
+/// Rows of a grid that stand in the table's heading.
+int HeadingRows(const QTableWidget& table) { return table.horizontalHeader()->isHidden() ? 0 : 1; }
+
 /// Well inside the heading, since its edge is for widening the column.
 QPoint HeadingOf(const QHeaderView& header, int col) {
   const int middle = header.sectionViewportPosition(col) + header.sectionSize(col) / 2;
@@ -162,13 +165,14 @@ Outcome WindowHand::Cell(Control& control, int row, int col) {
   if (!HasCell(control, row, col)) return Refused(control, "has no such cell");
   auto& table = static_cast<QTableWidget&>(*view.Widget());
   if (!Reach(view)) return OutOfReach(control);
-  table.scrollTo(table.model()->index(std::max(row - 1, 0), col));
+  const int in_table = row - HeadingRows(table);
+  table.scrollTo(table.model()->index(std::max(in_table, 0), col));
   SettleEvents();
-  if (row == 0) {
+  if (in_table < 0) {
     const QHeaderView& header = *table.horizontalHeader();
     ClickMouse(*header.viewport(), HeadingOf(header, col));
   } else {
-    ClickMouse(*table.viewport(), CellOf(table, row - 1, col));
+    ClickMouse(*table.viewport(), CellOf(table, in_table, col));
   }
   return Taken();
 }
@@ -178,12 +182,13 @@ Outcome WindowHand::CellTwice(Control& control, int row, int col) {
   Outcome outcome = Cell(control, row, col);
   if (!outcome.Done() || outcome.lost || !TakesSecondClick(control)) return outcome;
   auto& table = static_cast<QTableWidget&>(*ViewOf(control).Widget());
-  if (row == 0) {
+  const int in_table = row - HeadingRows(table);
+  if (in_table < 0) {
     const QHeaderView& header = *table.horizontalHeader();
     ClickMouseAgain(*header.viewport(), HeadingOf(header, col));
   } else {
     ClickMouseAgain(*table.viewport(), HasCell(control, row, col)
-                                           ? CellOf(table, row - 1, col)
+                                           ? CellOf(table, in_table, col)
                                            : table.viewport()->rect().center());
   }
   Taken();

@@ -1,4 +1,4 @@
-#include "results/date_steps.h"
+#include "data/date_steps.h"
 
 #include <gtest/gtest.h>
 

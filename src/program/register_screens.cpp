@@ -2,6 +2,7 @@
 
 #include <memory>
 
+#include "ladder/frmLadder.h"
 #include "results/frmChangeDate.h"
 #include "results/frmEdScore.h"
 #include "results/frmResults.h"
@@ -35,6 +36,7 @@ void RegisterScreens(Screens& screens, const Context& context) {
   Register<frmNames>(screens, "frmNames", context);
   Register<frmGameNames>(screens, "frmGameNames", context);
   Register<frmSeason>(screens, "frmSeason", context);
+  Register<frmLadder>(screens, "frmLadder", context);
   Register<frmResults>(screens, "frmResults", context);
   Register<frmEdScore>(screens, "frmEdScore", context);
   Register<frmChangeDate>(screens, "frmChangeDate", context);

@@ -393,7 +393,7 @@ TEST_F(MainMenu, TeamsDifferByCaseOfTheirLetters) {
 
 TEST_F(MainMenu, CommandsOfScreensThatAreNotThereOpenNothing) {
   OpenTwoTeams();
-  for (const char* command : {"click imgLadder", "click imgKO", "click imgbackup"}) {
+  for (const char* command : {"click imgKO", "click imgbackup"}) {
     Do(command);
     EXPECT_TRUE(Boxes().empty()) << command;
     EXPECT_EQ(Front(), "frmDB") << command;
@@ -474,7 +474,7 @@ TEST_F(MainMenu, MnemonicsReachTheEntriesOfAMenu) {
 
 TEST_F(MainMenu, EveryCommandTakesTheStatusLineAway) {
   OpenTwoTeams();
-  for (const char* command : {"click mnuFix", "click mnuSearchPlayer", "click imgLadder"}) {
+  for (const char* command : {"click mnuFix", "click mnuSearchPlayer", "click imgKO"}) {
     DoAll({"hover frmDB", "hover imgPrinter", command});
     EXPECT_FALSE(Shown("lblDescription")) << command;
   }

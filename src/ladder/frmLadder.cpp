@@ -12,6 +12,7 @@ namespace {
 constexpr const char* kCancel = "&Cancel";
 constexpr const char* kMainMenu = "&Main Menu";
 constexpr int kScoresHelpTopic = 160;
+constexpr int kPrintingHelpTopic = 246;
 constexpr int kTableHelpTopic = 161;
 /// In the Flag: a grade has been chosen.
 constexpr int kGradeChosen = 1;
@@ -26,6 +27,7 @@ frmLadder::frmLadder(Screens& screens, const Context& context)
   WireScores();
   WireEditing();
   WireTable();
+  WirePrinting();
   for (TextBox* box : {&txtDayName, &txtHome, &txtAway, &txtEdHome, &txtEdAway, &cfgGrade}) {
     box->SetLocked(true);
     box->SetTabStop(false);
@@ -52,6 +54,7 @@ void frmLadder::Wire() {
     help->Click = [this] { OpenHelp(kScoresHelpTopic); };
   }
   Command2.Click = [this] { OpenHelp(kTableHelpTopic); };
+  SSCommand5.Click = [this] { OpenHelp(kPrintingHelpTopic); };
 }
 
 void frmLadder::WireScores() {
@@ -276,7 +279,10 @@ void frmLadder::setTAB2() {
   cfgGames.SetFocus();
 }
 
-void frmLadder::HelpKey() { OpenHelp(fraPL.Visible() ? kTableHelpTopic : kScoresHelpTopic); }
+void frmLadder::HelpKey() {
+  if (fraPO.Visible()) return OpenHelp(kPrintingHelpTopic);
+  OpenHelp(fraPL.Visible() ? kTableHelpTopic : kScoresHelpTopic);
+}
 
 void frmLadder::OpenHelp(int topic) { context_.platform.help.Open("qz1.HLP", topic); }
 

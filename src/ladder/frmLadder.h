@@ -7,7 +7,9 @@
 
 #include "data/records.h"
 #include "ladder/ladder_rows.h"
+#include "ladder/print_tables.h"
 #include "print/font_box.h"
+#include "print/print_panel.h"
 #include "ui/context.h"
 #include "ui/controls.h"
 #include "ui/screen.h"
@@ -216,6 +218,14 @@ struct frmLadder : Screen {
   void SavePen();
   void cmdPenCancel_Click();
 
+  // Printing and copying.
+  void cmdPrintLad_Click();
+  void cmdBothOK_Click();
+  void Weekly();
+  void Ladder();
+  void PrintBoth();
+  void cmdClipLadder_Click();
+
   // Of the grade in hand.
   std::vector<std::string> TeamList;
   LadderRows rows;  ///< the table, as last worked out
@@ -225,6 +235,7 @@ struct frmLadder : Screen {
   void WireScores();
   void WireEditing();
   void WireTable();
+  void WirePrinting();
   void ShowAtStart();
   void ShowWorkDate();
   void LeaveConfiguration();
@@ -248,10 +259,16 @@ struct frmLadder : Screen {
   void ShowPenaltyWords();
   void StorePenalty(double points);
   void ClosePenalties();
+  [[nodiscard]] std::string LadderTitle() const;
+  void OfferTables(bool offered);
+  void ClosePrintOptions();
+  void Print(LadderPrintout what);
+  [[nodiscard]] LadderTab ShownTab() const;
   void OpenHelp(int topic);
 
   const Context& context_;
   Session& session_;
+  PrintPanel print_panel_{context_, {lblPrinterName, lblOrient, txtNoC, &cboFromTop}};
   FontBox font_box_{context_, {fraFontPick, lblFont, lblPrFont, lblFontInfo}};
   /// The one record buffer of the corrections: a save writes into it what the panel shows, and
   /// leaves in it what else the last record read had.

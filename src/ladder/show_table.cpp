@@ -132,9 +132,12 @@ void frmLadder::WriteLadderFile() {
   context_.channels.Close(Channel::Side);
 }
 
+std::string frmLadder::LadderTitle() const {
+  return session_.Grade + " PREMIERSHIP LADDER up to: " + LongDate(session_.LadderDate) + " ";
+}
+
 void frmLadder::GridLadder() {
-  lblLadHeader.SetCaption(session_.Grade +
-                          " PREMIERSHIP LADDER up to: " + LongDate(session_.LadderDate) + " ");
+  lblLadHeader.SetCaption(LadderTitle());
   grdLad.SetSize(static_cast<int>(rows.size()) + 1, kLadderCols);
   for (int col = 0; col < kLadderCols; ++col) {
     grdLad.SetCell(0, col, kHeadings[static_cast<std::size_t>(col)]);

@@ -8,9 +8,8 @@
 namespace marlowbeck {
 namespace {
 
-constexpr double kLeastDistance = 1;  // centimetres
-constexpr double kGreatestDistance = 30.5;
-constexpr double kStep = 0.5;
+constexpr int kLeastDistance = 2;  // half centimetres
+constexpr int kGreatestDistance = 61;
 
 }  // namespace
 
@@ -30,8 +29,8 @@ void PrintPanel::Open() {
   context_.platform.sound.Beep();
   if (controls_.from_top == nullptr) return;
   controls_.from_top->Clear();
-  for (double distance = kLeastDistance; distance <= kGreatestDistance; distance += kStep) {
-    controls_.from_top->AddLine(NumberText(distance));
+  for (int halves = kLeastDistance; halves <= kGreatestDistance; ++halves) {
+    controls_.from_top->AddLine(NumberText(halves / 2.0));
   }
   controls_.from_top->SetIndex(0);
 }

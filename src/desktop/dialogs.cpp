@@ -7,6 +7,7 @@
 
 #include "data/runtime_error.h"
 #include "desktop/encoding.h"
+#include "desktop/printer_font.h"
 #include "desktop/printer_setup.h"
 
 namespace marlowbeck {
@@ -48,14 +49,17 @@ std::optional<std::string> DesktopDialogs::File(const FileDialogRequest& request
 
 std::optional<FontChoice> DesktopDialogs::Font(const FontChoice& present) {
   before_();
-  QFont font(ToQt(present.name), std::max(present.size, 1));
-  font.setBold(present.bold);
-  font.setItalic(present.italic);
+  const QFont font =
+      FontOnScreen({present.name, present.size, present.bold, present.italic, false});
   QFontDialog dialog(font, QApplication::activeWindow());
   dialog.setOption(QFontDialog::DontUseNativeDialog);
+  const QString shown = dialog.currentFont().family();
   if (dialog.exec() != QDialog::Accepted) return std::nullopt;
   const QFont chosen = dialog.selectedFont();
-  return FontChoice{FromQt(chosen.family()), chosen.pointSize(), chosen.bold(), chosen.italic()};
+  // A font keeps its name where only its stand-in was seen.
+  const bool same = chosen.family() == shown && HasStandIn(present.name);
+  return FontChoice{same ? present.name : FromQt(chosen.family()), chosen.pointSize(),
+                    chosen.bold(), chosen.italic()};
 }
 
 std::optional<Orientation> DesktopDialogs::PrinterSetup(Orientation present) {

@@ -13,7 +13,7 @@ constexpr int kTwipsPerPoint = 20;
 
 QFont Drawn(const PrinterFont& font) {
   QStringList families = {"Liberation Sans", "Arial"};
-  if (font.name != "MS Sans Serif") families.prepend(ToQt(font.name));
+  if (!HasStandIn(font.name)) families.prepend(ToQt(font.name));
   QFont drawn;
   drawn.setFamilies(families);
   drawn.setBold(font.bold);
@@ -23,6 +23,8 @@ QFont Drawn(const PrinterFont& font) {
 }
 
 }  // namespace
+
+bool HasStandIn(const std::string& name) { return name == "MS Sans Serif"; }
 
 QFont FontInTwips(const PrinterFont& font) {
   QFont drawn = Drawn(font);

@@ -1,5 +1,7 @@
 #pragma once
 
+#include <string>
+
 #include <QFont>
 
 #include "platform/printer.h"
@@ -12,5 +14,7 @@ namespace marlowbeck {
 /// Where one unit is a twip.
 [[nodiscard]] QFont FontInTwips(const PrinterFont& font);
 [[nodiscard]] QFont FontOnScreen(const PrinterFont& font);
+/// Whether another face is drawn for a font of this name, wherever it is.
+[[nodiscard]] bool HasStandIn(const std::string& name);
 
 }  // namespace marlowbeck

@@ -187,6 +187,30 @@ TEST_F(FontDialogs, AnswerTheFontThatTheyShowForOneThatTheMachineLacks) {
   EXPECT_EQ(chosen->size, 10);
 }
 
+TEST_F(FontDialogs, KeepTheNameOfAFontWhoseStandInTheyShow) {
+  OnceUp<QFontDialog>([](QFontDialog& dialog) {
+    EXPECT_EQ(dialog.currentFont().family(), QString("Liberation Sans"));
+    QFont larger = dialog.currentFont();
+    larger.setPointSize(12);
+    dialog.setCurrentFont(larger);
+    Press(dialog, QDialogButtonBox::Ok);
+  });
+  const auto chosen = dialogs_.Font({"MS Sans Serif", 10, false, false});
+  ASSERT_TRUE(chosen.has_value());
+  EXPECT_EQ(chosen->name, "MS Sans Serif");
+  EXPECT_EQ(chosen->size, 12);
+}
+
+TEST_F(FontDialogs, AnswerAnotherFontThanTheStandIn) {
+  OnceUp<QFontDialog>([](QFontDialog& dialog) {
+    dialog.setCurrentFont(QFont("Liberation Serif", 12));
+    Press(dialog, QDialogButtonBox::Ok);
+  });
+  const auto chosen = dialogs_.Font({"MS Sans Serif", 10, false, false});
+  ASSERT_TRUE(chosen.has_value());
+  EXPECT_EQ(chosen->name, "Liberation Serif");
+}
+
 class SetupDialogs : public RealDialogs {
  protected:
   SetupDialogs() { printer_.SetTarget({PrintTarget::Kind::Pdf, {}}); }

@@ -105,6 +105,25 @@ TEST_F(LadderPrinting, ChecksComeInTheirOrderAndLeaveThePanelOpen) {
   ExpectRefusal("You must show NUMBER of COPIES to print!    ");
 }
 
+TEST_F(LadderPrinting, AnythingMayStandInTheBoxes) {
+  OpenPanel();
+  Do("click optBoth(2)");
+  const std::vector<std::string> texts = {"",    " ",   "x",     "1e400", "-1e400", "1e9",
+                                          "0x7", "1,5", "32768", "+",     ".",      "nan"};
+  for (const std::string& text : texts) {
+    for (const char* box : {"cboFromTop", "txtNoC"}) {
+      if (!Shown("fraPO")) Do("click cmdPrintLad");
+      DoAll({"type cboFromTop 1", "type txtNoC 1", std::string("type ") + box + " " + text,
+             "forget", "answer no"});
+      Do("click cmdBothOK");
+      // A page, a document thrown away, or a refusal: never an error, and never nothing.
+      EXPECT_EQ(Count("error"), 0) << box << " " << text;
+      EXPECT_EQ(Count("printed") + Count("killed") + (Shown("fraPO") ? 1 : 0), 1)
+          << box << " " << text;
+    }
+  }
+}
+
 TEST_F(LadderPrinting, ButtonsComeBackAfterPrinting) {
   OpenPanel();
   Print(1);

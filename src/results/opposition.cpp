@@ -11,9 +11,7 @@ namespace marlowbeck {
 void frmResults::GetOpp() {
   Session& session = context_.session;
   cboOpp.Clear();
-  std::vector<std::string> teams;
-  for (int i = 0; i < cboResTeam.Count(); ++i) teams.push_back(cboResTeam.Line(i));
-  OppositionFinder finder(teams, session.Team, session.WorkDate);
+  OppositionFinder finder(cboResTeam.Lines(), session.Team, session.WorkDate);
   other_teams_ = finder.OtherTeams();
   OpenResultSFile(session, context_.channels);
   ForEachResult([&](const ResultView& result, int) {

@@ -184,6 +184,7 @@ std::string PlayerView::FullName(std::string_view separator) const {
 
 std::string_view ResultView::Team() const { return Trimmed(ReadText(bytes_, 4, 30)); }
 std::string_view ResultView::Opposition() const { return Trimmed(ReadText(bytes_, 34, 30)); }
+std::string_view ResultView::OppositionAsStored() const { return ReadText(bytes_, 34, 30); }
 bool ResultView::IsForfeit() const { return Trimmed(ReadText(bytes_, 92, 30)) == "F"; }
 
 std::string_view LadderView::HomeTeam() const { return Trimmed(ReadText(bytes_, 0, 30)); }

@@ -200,6 +200,7 @@ class ResultView {
   [[nodiscard]] std::int32_t ID() const { return ReadLong(bytes_, 0); }
   [[nodiscard]] std::string_view Team() const;
   [[nodiscard]] std::string_view Opposition() const;
+  [[nodiscard]] std::string_view OppositionAsStored() const;  ///< padding included
   [[nodiscard]] Date GameDate() const { return ReadDate(bytes_, 84); }
   [[nodiscard]] bool IsForfeit() const;  ///< the mark, trimmed, is "F"
   [[nodiscard]] std::int16_t Legs() const { return ReadInteger(bytes_, 122); }

@@ -27,6 +27,11 @@ SideFileWriter& SideFileWriter::Truth(bool truth) {
   return *this;
 }
 
+SideFileWriter& SideFileWriter::Nothing() {
+  Item({});
+  return *this;
+}
+
 SideFileWriter& SideFileWriter::EndLine() {
   content_ += "\r\n";
   line_begun_ = false;

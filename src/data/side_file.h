@@ -16,6 +16,7 @@ class SideFileWriter {
   SideFileWriter& Number(double number);
   SideFileWriter& Day(Date date);     ///< #2004-03-31#
   SideFileWriter& Truth(bool truth);  ///< #TRUE# or #FALSE#
+  SideFileWriter& Nothing();          ///< an empty item
   SideFileWriter& EndLine();
 
   /// The plain form: one item on a line of its own, no quotes.

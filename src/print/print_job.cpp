@@ -53,6 +53,13 @@ bool PrintJob::FitsAcross(double table_width) {
   return false;
 }
 
+void PrintJob::RefuseForOnePage() {
+  Refuse(Lines(
+      {"Your selections will not fit on one page.   ", "Printing will now be cancelled.    ",
+       "<<WARNING>> This may take some time    ", "depending on printer status.    ", "",
+       "Note: Choose a smaller font to fit more   ", "onto a page or limit your selections.    "}));
+}
+
 void PrintJob::Refuse(std::string_view message) {
   context_.platform.printer.KillDoc();
   Warning(context_, message);

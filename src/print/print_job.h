@@ -37,6 +37,8 @@ class PrintJob {
   [[nodiscard]] bool FitsAcross(double table_width);
   /// How far down the last row of a page may reach.
   [[nodiscard]] double Foot(double pitch) const { return page_.Height() - (pitch + 400); }
+  /// Refuses what has no room on one page, in the words of all reports.
+  void RefuseForOnePage();
   /// Throws the document away and warns.
   void Refuse(std::string_view message);
 

@@ -90,11 +90,7 @@ class Report {
   /// Looked at after each row.
   bool Fits(const TableLayout& layout) {
     if (page_.Y() <= job_.Foot(layout.Pitch())) return true;
-    job_.Refuse(
-        Lines({"Your selections will not fit on one page.   ",
-               "Printing will now be cancelled.    ", "<<WARNING>> This may take some time    ",
-               "depending on printer status.    ", "", "Note: Choose a smaller font to fit more   ",
-               "onto a page or limit your selections.    "}));
+    job_.RefuseForOnePage();
     return false;
   }
 

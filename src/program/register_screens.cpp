@@ -6,6 +6,8 @@
 #include "results/frmChangeDate.h"
 #include "results/frmEdScore.h"
 #include "results/frmResults.h"
+#include "season/frmAnnual.h"
+#include "season/frmPegRatio.h"
 #include "season/frmPlayersLists.h"
 #include "season/frmSearchPlayer.h"
 #include "session/frmAbout.h"
@@ -41,6 +43,8 @@ void RegisterScreens(Screens& screens, const Context& context) {
   Register<frmEdScore>(screens, "frmEdScore", context);
   Register<frmChangeDate>(screens, "frmChangeDate", context);
   Register<frmPMenu>(screens, "frmPMenu", context);
+  Register<frmAnnual>(screens, "frmAnnual", context);
+  Register<frmPegRatio>(screens, "frmPegRatio", context);
   Register<frmPlayersLists>(screens, "frmPlayersLists", context);
   Register<frmSearchPlayer>(screens, "frmSearchPlayer", context);
   Register<frmErrors>(screens, "frmErrors", context);

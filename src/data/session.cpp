@@ -38,17 +38,19 @@ std::vector<SessionField> FieldsOf(const Session& session) {
       {"TeamCount", int{s.TeamCount}},
       {"DateList", s.DateList},
       {"SearchText", s.SearchText},
-      {"Quiet", s.Quiet},
-      {"ReportChoice", s.ReportChoice},
       {"Opposition", s.Opposition},
+      {"HiLabel", s.HiLabel},
       {"TeamDates", s.TeamDates},
+      {"MeanAverage", s.MeanAverage},
+      {"ReportChoice", s.ReportChoice},
       {"DateCount", int{s.DateCount}},
       {"RowCount", int{s.RowCount}},
-      {"PrintFontSize", int{s.PrintFontSize}},
       {"PrintFontName", s.PrintFontName},
+      {"PrintFontSize", int{s.PrintFontSize}},
       {"PrintFontBold", s.PrintFontBold},
       {"PrintFontItalic", s.PrintFontItalic},
       {"PrintBoldBase", s.PrintBoldBase},
+      {"Quiet", s.Quiet},
   };
 }
 

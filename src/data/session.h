@@ -52,23 +52,25 @@ struct Session {
 
   std::string SearchText;  ///< upper-cased part of a surname to look for
 
-  bool Quiet = false;  ///< warnings of a guard are held back (score sheets)
-
-  int ReportChoice = 0;         ///< which entry of the Reports menu is open
   std::string Opposition;       ///< the opposing team of the date in hand (reports)
+  std::string HiLabel;          ///< what the values of the list in hand are headed with (reports)
   std::vector<Date> TeamDates;  ///< the distinct dates of the team or grade in hand
-  Integer DateCount;            ///< how many they are, or those of the ladder
+  double MeanAverage = 0;       ///< that handicaps were last worked out from (reports)
+  int ReportChoice = 0;         ///< which entry of the Reports menu is open
+  Integer DateCount;            ///< the dates of TeamDates, or those of the ladder
   Integer RowCount;             ///< rows of the table in hand
 
-  std::int32_t PrintFontSize = 10;  ///< whole points
   std::string PrintFontName = "MS Sans Serif";
+  std::int32_t PrintFontSize = 10;  ///< whole points
   bool PrintFontBold = false;
   bool PrintFontItalic = false;
   bool PrintBoldBase = false;  ///< the printer's bold once it is prepared
+
+  bool Quiet = false;  ///< warnings of a guard are held back (score sheets)
 };
 
 using SessionValue =
-    std::variant<std::string, int, bool, Date, std::vector<std::string>, std::vector<Date>>;
+    std::variant<std::string, int, bool, double, Date, std::vector<std::string>, std::vector<Date>>;
 
 struct SessionField {
   std::string_view name;

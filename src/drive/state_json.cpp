@@ -49,6 +49,7 @@ struct AnyAsJson {
   Json operator()(const std::string& text) const { return TextAsJson(text); }
   Json operator()(int number) const { return number; }
   Json operator()(bool truth) const { return truth; }
+  Json operator()(double number) const { return number; }
   Json operator()(Date date) const { return DateOrNull(date); }
   Json operator()(const std::vector<std::string>& texts) const { return TextsAsJson(texts); }
   Json operator()(const std::vector<Date>& dates) const {

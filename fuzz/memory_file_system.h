@@ -34,6 +34,11 @@ class MemoryFileSystem : public FileSystem {
     Require(path);
     files_.erase(UpperCase(path));
   }
+  std::uint64_t LengthOf(const std::string& path) override {
+    Require(path);
+    return Bytes(path).size();
+  }
+  void Discard(const std::string& path) override { files_.erase(UpperCase(path)); }
   void Rename(const std::string& from, const std::string& to) override {
     if (Exists(to)) throw RunTimeError(ErrorNumber::FileAlreadyExists);
     Replace(from, to);
@@ -53,6 +58,7 @@ class MemoryFileSystem : public FileSystem {
   void ChangeFolder(const std::string&) override {}
   std::string CurrentFolder() override { return "/"; }
   std::string WholePath(const std::string&) override { return "/"; }
+  bool AreSameFolder(const std::string&, const std::string&) override { return true; }
   std::vector<std::string> Drives() override { return {"/"}; }
 
  private:

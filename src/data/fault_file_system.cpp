@@ -127,6 +127,15 @@ void FaultFileSystem::Delete(const std::string& path) {
   real_.Delete(path);
 }
 
+void FaultFileSystem::Discard(const std::string& path) {
+  try {
+    plan_.Begin(FileOperation::Delete);
+  } catch (const RunTimeError&) {
+    return;
+  }
+  real_.Discard(path);
+}
+
 void FaultFileSystem::Rename(const std::string& from, const std::string& to) {
   plan_.Begin(FileOperation::Rename);
   real_.Rename(from, to);

@@ -78,7 +78,10 @@ class FaultFileSystem : public FileSystem {
 
   std::unique_ptr<File> Open(const std::string& path, OpenMode mode) override;
   bool Exists(const std::string& path) override { return real_.Exists(path); }
+  std::uint64_t LengthOf(const std::string& path) override { return real_.LengthOf(path); }
   void Delete(const std::string& path) override;
+  /// Counts as a deletion. One that is to fail leaves the file.
+  void Discard(const std::string& path) override;
   void Rename(const std::string& from, const std::string& to) override;
   void Replace(const std::string& from, const std::string& to) override;
   void Copy(const std::string& from, const std::string& to) override;
@@ -88,6 +91,9 @@ class FaultFileSystem : public FileSystem {
   void ChangeFolder(const std::string& folder) override { real_.ChangeFolder(folder); }
   std::string CurrentFolder() override { return real_.CurrentFolder(); }
   std::string WholePath(const std::string& folder) override { return real_.WholePath(folder); }
+  bool AreSameFolder(const std::string& a, const std::string& b) override {
+    return real_.AreSameFolder(a, b);
+  }
   std::vector<std::string> Drives() override { return real_.Drives(); }
 
  private:

@@ -44,12 +44,18 @@ class FileSystem {
 
   [[nodiscard]] virtual std::unique_ptr<File> Open(const std::string& path, OpenMode mode) = 0;
   [[nodiscard]] virtual bool Exists(const std::string& path) = 0;
+  /// In bytes.
+  [[nodiscard]] virtual std::uint64_t LengthOf(const std::string& path) = 0;
   virtual void Delete(const std::string& path) = 0;
+  /// Takes away a work file that is of no more use, whatever its protection. That there is none, or
+  /// that it cannot be, is of no matter.
+  virtual void Discard(const std::string& path) = 0;
   /// Fails with FileAlreadyExists when there is a file named `to`.
   virtual void Rename(const std::string& from, const std::string& to) = 0;
   /// Puts `from` in the place of `to`, whether or not that exists, in one step, and returns once
   /// the folder has reached the disk. Both must lie on one volume.
   virtual void Replace(const std::string& from, const std::string& to) = 0;
+  /// All of a file, with the time of its last change. Returns once the bytes have reached the disk.
   virtual void Copy(const std::string& from, const std::string& to) = 0;
   virtual void MakeFolder(const std::string& path) = 0;
   virtual void RemoveFolder(const std::string& path) = 0;
@@ -60,6 +66,9 @@ class FileSystem {
   /// A folder's path from the root on, as it lies on the disk and without a separator at its end.
   /// Throws PathNotFound when there is no such folder.
   [[nodiscard]] virtual std::string WholePath(const std::string& folder) = 0;
+  /// Whether two folders are one and the same, by whatever spelling, link or mount they are
+  /// reached.
+  [[nodiscard]] virtual bool AreSameFolder(const std::string& a, const std::string& b) = 0;
   /// The drives: letters as "C:", or the folders at which disks are mounted.
   [[nodiscard]] virtual std::vector<std::string> Drives() = 0;
 };

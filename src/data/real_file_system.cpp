@@ -241,14 +241,23 @@ void SyncFile(const fs::path& path) {
   file.Close();
 }
 
+/// Returns once the copy has reached the disk.
+void CopyWithTime(const fs::path& source, const fs::path& target) {
+  std::error_code error;
+  fs::copy_file(source, target, fs::copy_options::overwrite_existing, error);
+  Check(error, target);
+  // A disk that keeps no times, or not of this user's files, is none the worse for it.
+  const auto changed = fs::last_write_time(source, error);
+  if (!error) fs::last_write_time(target, changed, error);
+  SyncFile(target);
+}
+
 /// Puts a file in the place of one on another volume: by a copy beside it.
 void ReplaceAcrossVolumes(const fs::path& source, const fs::path& target) {
   fs::path copy = target;
   copy += ".new";
+  CopyWithTime(source, copy);
   std::error_code error;
-  fs::copy_file(source, copy, fs::copy_options::overwrite_existing, error);
-  Check(error, copy);
-  SyncFile(copy);
   fs::rename(copy, target, error);
   Check(error, target);
   SyncFolderOf(target);
@@ -320,6 +329,14 @@ bool RealFileSystem::Exists(const std::string& path) {
   return fs::exists(Located(path), error);
 }
 
+std::uint64_t RealFileSystem::LengthOf(const std::string& path) {
+  const fs::path located = Located(path);
+  std::error_code error;
+  const std::uintmax_t length = fs::file_size(located, error);
+  Check(error, located);
+  return length;
+}
+
 void RealFileSystem::Delete(const std::string& path) {
   const fs::path located = Located(path);
   std::error_code error;
@@ -328,6 +345,14 @@ void RealFileSystem::Delete(const std::string& path) {
   const bool was_there = fs::remove(located, error);
   Check(error, located);
   if (!was_there) Fail(ENOENT, located);
+}
+
+void RealFileSystem::Discard(const std::string& path) {
+  const fs::path located = Located(path);
+  std::error_code error;
+  if (!fs::is_regular_file(fs::symlink_status(located, error))) return;
+  fs::permissions(located, fs::perms::owner_write, fs::perm_options::add, error);
+  fs::remove(located, error);
 }
 
 void RealFileSystem::Rename(const std::string& from, const std::string& to) {
@@ -366,9 +391,7 @@ void RealFileSystem::Copy(const std::string& from, const std::string& to) {
   if (fs::is_directory(source, error) || fs::is_directory(target, error)) {
     throw RunTimeError(ErrorNumber::PathFileAccess);
   }
-  fs::copy_file(source, target, fs::copy_options::overwrite_existing, error);
-  Check(error, target);
-  SyncFile(target);
+  CopyWithTime(source, target);
 }
 
 void RealFileSystem::MakeFolder(const std::string& path) {
@@ -417,6 +440,13 @@ std::string RealFileSystem::CurrentFolder() { return TextOfPath(current_); }
 
 std::string RealFileSystem::WholePath(const std::string& folder) {
   return TextOfPath(LocatedFolder(folder));
+}
+
+bool RealFileSystem::AreSameFolder(const std::string& a, const std::string& b) {
+  const fs::path one = LocatedFolder(a);
+  const fs::path other = LocatedFolder(b);
+  std::error_code error;
+  return fs::equivalent(one, other, error);
 }
 
 std::vector<std::string> RealFileSystem::Drives() { return DrivesOfMachine(); }

@@ -14,7 +14,9 @@ class RealFileSystem : public FileSystem {
 
   std::unique_ptr<File> Open(const std::string& path, OpenMode mode) override;
   bool Exists(const std::string& path) override;
+  std::uint64_t LengthOf(const std::string& path) override;
   void Delete(const std::string& path) override;
+  void Discard(const std::string& path) override;
   void Rename(const std::string& from, const std::string& to) override;
   void Replace(const std::string& from, const std::string& to) override;
   void Copy(const std::string& from, const std::string& to) override;
@@ -24,6 +26,7 @@ class RealFileSystem : public FileSystem {
   void ChangeFolder(const std::string& folder) override;
   std::string CurrentFolder() override;
   std::string WholePath(const std::string& folder) override;
+  bool AreSameFolder(const std::string& a, const std::string& b) override;
   std::vector<std::string> Drives() override;
 
  private:

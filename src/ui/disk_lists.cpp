@@ -1,5 +1,6 @@
 #include "ui/disk_lists.h"
 
+#include <algorithm>
 #include <utility>
 
 #include "data/runtime_error.h"
@@ -50,14 +51,24 @@ void DiskList::SetLines(const std::vector<std::string>& lines) {
   for (const std::string& line : lines) AddLine(line);
 }
 
-void DriveList::SetDrive(std::string_view path) {
+int DriveList::LineOf(std::string_view path) const {
   int innermost = -1;
   for (int line = 0; line < Count(); ++line) {
     if (!LiesOn(path, Line(line))) continue;
     if (innermost < 0 || Line(line).size() > Line(innermost).size()) innermost = line;
   }
-  if (innermost < 0) throw RunTimeError(ErrorNumber::DeviceUnavailable);
-  SetIndex(innermost);
+  return innermost;
+}
+
+void DriveList::SetDrive(std::string_view path) {
+  const int line = LineOf(path);
+  if (line < 0) throw RunTimeError(ErrorNumber::DeviceUnavailable);
+  SetIndex(line);
+}
+
+void DriveList::ShowDriveOf(std::string_view path) {
+  SetIndexSilently(LineOf(path));
+  drive_ = Index() < 0 ? std::string() : Line(Index());
 }
 
 void DriveList::Refresh() {
@@ -106,6 +117,17 @@ void FileList::SetPattern(std::string_view pattern) {
     pattern_ = std::move(before);
     throw;
   }
+}
+
+void FileList::Include(const std::string& name) {
+  std::vector<std::string> lines = Lines();
+  const auto comes_before = [](const std::string& a, const std::string& b) {
+    return std::pair(UpperCase(a), a) < std::pair(UpperCase(b), b);
+  };
+  const auto place = std::lower_bound(lines.begin(), lines.end(), name, comes_before);
+  const bool is_listed = place != lines.end() && *place == name;
+  if (!is_listed && MatchesPattern(name, pattern_)) lines.insert(place, name);
+  SetLines(lines);
 }
 
 std::vector<std::string> FileList::LinesFor(const std::string& /*folder*/,

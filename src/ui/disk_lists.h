@@ -44,6 +44,8 @@ class DriveList : public DiskList {
   /// Change when it is another one, as a person's pick does. Throws DeviceUnavailable when it lies
   /// on none.
   void SetDrive(std::string_view path);
+  /// The same for what is on show already: fires nothing. A path on no drive makes none current.
+  void ShowDriveOf(std::string_view path);
   /// The current drive stays current as long as it is there.
   void Refresh() override;
 
@@ -51,6 +53,9 @@ class DriveList : public DiskList {
   void IndexAssigned() override;
 
  private:
+  /// The line of the innermost drive on which a path lies; -1 when it lies on none.
+  [[nodiscard]] int LineOf(std::string_view path) const;
+
   std::string drive_;
 };
 
@@ -101,6 +106,9 @@ class FileList : public PathList {
   [[nodiscard]] const std::string& Pattern() const { return pattern_; }
   /// One pattern, or several parted by semicolons, as MatchesPattern takes them.
   void SetPattern(std::string_view pattern);
+  /// A file of this name lies in the folder now: lists it where Refresh would, without a look at
+  /// the disk. For long runs, at whose end Refresh has the last word.
+  void Include(const std::string& name);
 
  protected:
   [[nodiscard]] std::vector<std::string> LinesFor(

@@ -119,6 +119,16 @@ TEST_F(Faults, ACopyCountsAsAWriteThatCanBeCut) {
   EXPECT_EQ(folder.Read("b"), "abcdef");
 }
 
+TEST_F(Faults, AWorkFileThatCannotBeDiscardedStays) {
+  Write("a.txt", "x");
+  Plan().FailAt(FileOperation::Delete, 1, 75, false);
+  files.Discard("a.txt");
+  EXPECT_TRUE(files.Exists("a.txt"));
+  files.Discard("a.txt");
+  EXPECT_FALSE(files.Exists("a.txt"));
+  EXPECT_EQ(Plan().Done(FileOperation::Delete), 2);
+}
+
 TEST_F(Faults, AKillComesInThePlaceOfTheOperation) {
   Write("a", "old");
   Plan().CrashAt(FileOperation::Rename, 1);

@@ -2,6 +2,7 @@
 
 #include <unistd.h>
 
+#include <chrono>
 #include <filesystem>
 #include <span>
 
@@ -258,6 +259,46 @@ TEST_F(RealFiles, CopiesOverAnOldFileAndNeverOntoItself) {
   EXPECT_EQ(Read("b.txt"), "content");
   EXPECT_NE(ErrorOf([&] { files.Copy("a.txt", "A.TXT"); }), 0);
   EXPECT_EQ(Read("a.txt"), "content");
+}
+
+TEST_F(RealFiles, ACopyHasTheTimeOfTheLastChange) {
+  Write("a.txt", "new");
+  Write("b.txt", "older still");
+  const auto changed = fs::last_write_time(folder.In("a.txt")) - std::chrono::hours(50);
+  fs::last_write_time(folder.In("a.txt"), changed);
+  files.Copy("a.txt", "b.txt");
+  EXPECT_EQ(fs::last_write_time(folder.In("b.txt")), changed);
+  EXPECT_EQ(Read("b.txt"), "new");
+}
+
+TEST_F(RealFiles, TellsTheLengthOfAFileThatIsThere) {
+  Write("a.txt", "");
+  Write("b.txt", "three");
+  EXPECT_EQ(files.LengthOf("a.txt"), 0U);
+  EXPECT_EQ(files.LengthOf("B.TXT"), 5U);
+  EXPECT_ERROR(53, (void)files.LengthOf("c.txt"));
+}
+
+TEST_F(RealFiles, AWorkFileIsDiscardedWhateverItsProtection) {
+  Write("a.txt", "x");
+  fs::permissions(folder.In("a.txt"), fs::perms::owner_read);
+  files.Discard("a.txt");
+  EXPECT_FALSE(files.Exists("a.txt"));
+  files.Discard("a.txt");
+  files.MakeFolder("b");
+  files.Discard("b");
+  EXPECT_TRUE(files.Exists("b"));
+}
+
+TEST_F(RealFiles, AFolderIsTheSameByAnySpellingAndLink) {
+  files.MakeFolder("one");
+  files.MakeFolder("two");
+  fs::create_directory_symlink(folder.In("one"), folder.In("link"));
+  EXPECT_TRUE(files.AreSameFolder("one", "ONE"));
+  EXPECT_TRUE(files.AreSameFolder("one", folder.In("two/../one")));
+  EXPECT_TRUE(files.AreSameFolder("link", "one"));
+  EXPECT_FALSE(files.AreSameFolder("one", "two"));
+  EXPECT_ERROR(76, (void)files.AreSameFolder("one", "three"));
 }
 
 TEST_F(RealFiles, MakesListsAndRemovesFolders) {

@@ -123,5 +123,46 @@ TEST_F(DriveListTest, ADriveThatIsStillThereStaysCurrentWhereverItStands) {
   EXPECT_EQ(changes, 0);
 }
 
+TEST_F(DriveListTest, TheDriveOfWhatIsOnShowBecomesCurrentInSilence) {
+  int told = 0;
+  list.Change = [&] { ++told; };
+  list.Click = [&] { ++told; };
+  list.ShowDriveOf("/media/stick/club");
+  EXPECT_EQ(list.Drive(), "/media/stick");
+  EXPECT_EQ(list.Index(), 1);
+  EXPECT_EQ(told, 0);
+  list.SetIndex(1);
+  EXPECT_EQ(told, 1) << "picked again it is no other drive";
+  disk.drives = {"C:"};
+  list.Refresh();
+  list.ShowDriveOf("D:\\club");
+  EXPECT_EQ(list.Index(), -1);
+}
+
+/// A folder whose files a test names.
+class NamedFiles : public fuzz::MemoryFileSystem {
+ public:
+  std::vector<FolderEntry> entries;
+  std::vector<FolderEntry> List(const std::string&) override { return entries; }
+};
+
+TEST(FileListTest, IncludesANameWhereARefreshWouldListIt) {
+  NamedFiles disk;
+  disk.entries = {{"b.qza"}, {"D.qza"}};
+  Screens screens{[](int) {}};
+  Screen screen(screens, "frmFiles", "");
+  FileList list(screen, "f", disk);
+  list.SetMulti(true);
+  list.SetPattern("*.qza");
+  list.SetPath("/");
+  list.SetMarked(0, true);
+  for (const char* name : {"C.qza", "a.QZA", "e.qza", "b.qza", "c.txt", "c.qza"}) {
+    list.Include(name);
+  }
+  EXPECT_EQ(list.Lines(),
+            (std::vector<std::string>{"a.QZA", "b.qza", "C.qza", "c.qza", "D.qza", "e.qza"}));
+  EXPECT_TRUE(list.Marked().empty());
+}
+
 }  // namespace
 }  // namespace marlowbeck

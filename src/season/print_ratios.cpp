@@ -1,8 +1,7 @@
 #include "season/print_ratios.h"
 
 #include "data/text.h"
-#include "print/table_layout.h"
-#include "session/messages.h"
+#include "print/paged_rows.h"
 
 namespace marlowbeck {
 namespace {
@@ -20,7 +19,13 @@ class RatioPrint {
         page_(job.OnPage()),
         heading_(heading),
         rows_(rows),
-        layout_(Measured()) {}
+        layout_(Measured()) {
+    int number = 0;
+    for (const RatioRow& row : rows) {
+      const auto cells = RatioCells(++number, row);
+      cells_.emplace_back(cells.begin(), cells.end());
+    }
+  }
 
   void Print() {
     if (!job_.FitsAcross(layout_.Width())) return;
@@ -54,31 +59,11 @@ class RatioPrint {
       page_.PrintCentred(Trim(line));
       page_.MoveDown(kBetweenLines * page_.TextHeight());
     }
-    layout_.PrintRow(page_, {"Num", "Player", "Team", "Legs", "Pegs", "Ratio"});
-    for (std::size_t row = 0; row < rows_.size(); ++row) {
-      const auto cells = RatioCells(static_cast<int>(row) + 1, rows_[row]);
-      layout_.PrintRow(page_, {cells.begin(), cells.end()});
-      const bool at_foot = page_.Y() >= job_.Foot(layout_.Pitch());
-      if (at_foot && row + 1 < rows_.size() && !GoOn(row + 1)) return false;
-    }
-    return true;
-  }
-
-  /// Asks for another page, and goes to it.
-  bool GoOn(std::size_t done) {
-    const int answer = WarningYesNo(
-        context_, Lines({"Only " + std::to_string(done) + " players of " +
-                             std::to_string(rows_.size()) + " will fit on one page.   ",
-                         "Do you wish to use another page ?    ", "",
-                         "By selecting NO, printing will be cancelled,    ",
-                         "allowing you to select a smaller font.    "}));
-    if (answer == kAnswerNo) {
-      context_.platform.printer.KillDoc();
-      return false;
-    }
-    page_.NewPage();
-    page_.MoveTo(kFirstLine);
-    return true;
+    PagedRows rows(layout_, headings_, cells_);
+    rows.bold_heading = false;
+    rows.full = PagedRows::Full::AtTheFoot;
+    rows.first_line = kFirstLine;
+    return PrintPagedRows(context_, job_, rows);
   }
 
   const Context& context_;
@@ -87,6 +72,8 @@ class RatioPrint {
   const std::vector<std::string>& heading_;
   const std::vector<RatioRow>& rows_;
   TableLayout layout_;
+  const std::vector<std::string> headings_ = {"Num", "Player", "Team", "Legs", "Pegs", "Ratio"};
+  std::vector<std::vector<std::string>> cells_;
 };
 
 }  // namespace

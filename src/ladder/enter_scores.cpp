@@ -15,17 +15,25 @@ constexpr const char* kNoTeams = "No Teams to Enter";
 }  // namespace
 
 void frmLadder::EnterScores() {
+  EmptyPanel();
+  try {
+    FillPanel();
+  } catch (const RunTimeError&) {
+    EmptyPanel();
+    throw;
+  }
+}
+
+void frmLadder::FillPanel() {
   fraScores.Show();
   fraScores.Enable();
   fraScoresIn.Show();
   session_.Grade = Trim(cboResGrade.Text());
   GetNewFileName();
   GetTeams();
-  lstTeams.Clear();
   for (const std::string& team : TeamList) lstTeams.AddLine(team);
   fraChangeGrade.Hide();
   OpenConfig();
-  BlankEntry();
   ShowWorkDate();
   session_.LadderDate = session_.WorkDate;
   SaveWorkdate();
@@ -34,6 +42,15 @@ void frmLadder::EnterScores() {
   ListDone();
   if (lstTeams.Count() == 0) lblHomeAway.SetCaption(kNoTeams);
   GetDates();
+}
+
+/// Whatever of a grade and date stands there goes: should the panel not come to be filled, nothing
+/// must be saved or put right under another grade or date.
+void frmLadder::EmptyPanel() {
+  BlankEntry();
+  lstTeams.Clear();
+  lstDone.Clear();
+  for (Label& header : lblHeader) header.SetCaption({});
 }
 
 void frmLadder::BlankEntry() {
@@ -48,7 +65,6 @@ void frmLadder::BlankEntry() {
 
 /// Lists the matches of the date; their teams have played and are taken out of the list of teams.
 void frmLadder::ListDone() {
-  lstDone.Clear();
   OpenLadderFile(session_, context_.channels);
   context_.channels.ForEachRecord(Channel::Ladder, [&](Bytes bytes, int) {
     const LadderView match(bytes);

@@ -222,6 +222,7 @@ void frmLadder::cmdChangeGrade_Click() {
 }
 
 void frmLadder::setTAB0() {
+  EmptyPanel();  // grade and date in hand are those of the ladder
   fraSC.Show();
   fraPL.Hide();
   fraCF.Hide();
@@ -249,10 +250,11 @@ void frmLadder::setTAB1() {
   cmdPL.Disable();
   cmdSC.Enable();
   cmdCF.Enable();
-  for (Control* control : std::initializer_list<Control*>{&lblGameDetails, &lblLadHeader, &grdLad,
-                                                          &grdWk, &fraPenalty, &fraPenPts}) {
-    control->Hide();
+  for (Control* control : std::initializer_list<Control*>{
+           &lblGameDetails, &lblLadHeader, &grdLad, &grdWk, &fraPenalty, &fraPenPts, &fraCmds}) {
+    control->Hide();  // the commands until there is a date
   }
+  lstTableDates.Clear();
   font_box_.GetFont();
   if (session_.DateCount > 0) {
     GetDates();

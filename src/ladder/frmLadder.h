@@ -239,6 +239,8 @@ struct frmLadder : Screen {
   void ShowAtStart();
   void ShowWorkDate();
   void LeaveConfiguration();
+  void FillPanel();
+  void EmptyPanel();
   void BlankEntry();
   void ListDone();
   void TakeOutTeams(const LadderView& match);

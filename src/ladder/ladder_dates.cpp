@@ -31,6 +31,7 @@ void frmLadder::SortLadderFile() {
 
 void frmLadder::GetDates() {
   session_.DateCount = 0;
+  session_.DateList.clear();
   std::vector<Date> dates;
   OpenLadderFile(session_, context_.channels);
   context_.channels.ForEachRecord(
@@ -41,6 +42,7 @@ void frmLadder::GetDates() {
 }
 
 void frmLadder::GoToDate(Date date) {
+  EmptyPanel();
   session_.WorkDate = date;
   ShowWorkDate();
   EdCal.SetValue(date);

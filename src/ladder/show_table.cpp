@@ -70,9 +70,6 @@ void frmLadder::lstTableDates_Click() {
   EraseArrays();
   session_.LadderDate = SelectedDate();
   session_.WorkDate = session_.LadderDate;
-  // Until it has been worked out anew no table of another date is to be seen.
-  grdLad.Hide();
-  lblLadHeader.Hide();
   GetGameResults();
   WorkOutTable();
 }
@@ -80,6 +77,9 @@ void frmLadder::lstTableDates_Click() {
 void frmLadder::EraseArrays() {
   session_.DateList.clear();
   rows.clear();
+  // Until it has been worked out anew no table that holds no more is to be seen, or printed.
+  grdLad.Hide();
+  lblLadHeader.Hide();
 }
 
 void frmLadder::GetGameResults() {

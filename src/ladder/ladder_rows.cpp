@@ -1,6 +1,7 @@
 #include "ladder/ladder_rows.h"
 
 #include <algorithm>
+#include <bit>
 #include <cstdlib>
 #include <cstring>
 #include <utility>
@@ -63,10 +64,9 @@ bool LadderTally::AreEqual(const NameWords& a, const NameWords& b) {
 /// Any place will do, as long as names that differ in a few letters get different ones.
 std::size_t LadderTally::PlaceOf(const NameWords& words) {
   constexpr std::uint64_t kMix = 0x9E3779B97F4A7C15;
-  std::uint64_t mixed = words[0] * kMix ^ words[1];
-  mixed = (mixed ^ (mixed >> 32)) * kMix ^ words[2] ^ (words[3] << 7);
-  mixed = (mixed ^ (mixed >> 32)) * kMix;
-  return mixed >> (64 - kKnownNamesBits);
+  const std::uint64_t all =
+      words[0] ^ std::rotl(words[1], 13) ^ std::rotl(words[2], 29) ^ std::rotl(words[3], 43);
+  return (all * kMix) >> (64 - kKnownNamesBits);
 }
 
 int LadderTally::RowOf(Bytes field) {
@@ -85,20 +85,12 @@ int LadderTally::Learn(KnownName& known, const NameWords& words, Bytes field) co
   return known.row;
 }
 
-void LadderTally::Add(const LadderView& match) {
-  if (!(match.GameDate() <= up_to_)) return;
-  const std::int16_t home = match.HomeScore();
-  const std::int16_t away = match.AwayScore();
-  Count(RowOf(match.HomeField()), {home, away, match.HomePenalty()});
-  Count(RowOf(match.AwayField()), {away, home, match.AwayPenalty()});
-}
-
-void LadderTally::Count(int row, const Side& side) {
+inline void LadderTally::Count(int row, const Side& side) {
   if (row == kNobody) return;
   Sums& team = sums_[static_cast<std::size_t>(row)];
   ++team.played;
-  team.won += side.own > side.other ? 1 : 0;
-  team.lost += side.own < side.other ? 1 : 0;
+  team.won += static_cast<int>(side.own > side.other);
+  team.lost += static_cast<int>(side.own < side.other);
   team.games_for += side.own;
   team.against += side.other;
   team.adjust += side.penalty;
@@ -106,6 +98,14 @@ void LadderTally::Count(int row, const Side& side) {
   const bool small = std::int64_t{team.played} * most_worth_ + std::abs(team.adjust) <= INT16_MAX &&
                      std::abs(team.games_for) < kSmallFor && std::abs(team.against) <= INT16_MAX;
   if (!small) CheckFigures(team);
+}
+
+void LadderTally::Add(const LadderView& match) {
+  if (!(match.GameDate() <= up_to_)) return;
+  const std::int16_t home = match.HomeScore();
+  const std::int16_t away = match.AwayScore();
+  Count(RowOf(match.HomeField()), {home, away, match.HomePenalty()});
+  Count(RowOf(match.AwayField()), {away, home, match.AwayPenalty()});
 }
 
 /// Every result on the way, in the order that it is formed in: whichever leaves 16 bits, it is the

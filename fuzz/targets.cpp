@@ -2,9 +2,6 @@
 
 #include <algorithm>
 #include <cmath>
-#include <cstdio>
-#include <cstdlib>
-#include <functional>
 #include <string>
 #include <vector>
 
@@ -14,6 +11,7 @@
 #include "data/numbers.h"
 #include "data/side_file.h"
 #include "data/text.h"
+#include "fuzz/checks.h"
 #include "fuzz/memory_file_system.h"
 #include "results/opposition_finder.h"
 #include "results/player_listing.h"
@@ -22,24 +20,8 @@
 namespace marlowbeck::fuzz {
 namespace {
 
-void Must(bool holds, const char* what) {
-  if (holds) return;
-  std::fprintf(stderr, "does not hold: %s\n", what);
-  std::abort();
-}
-
 std::string TextOf(Input input) {
   return {reinterpret_cast<const char*>(input.data()), input.size()};
-}
-
-/// Answers whether it went through without a run-time error.
-bool Try(const std::function<void()>& action) {
-  try {
-    action();
-    return true;
-  } catch (const RunTimeError&) {
-    return false;
-  }
 }
 
 std::vector<std::string> TextsOf(const std::string& content) {
@@ -69,16 +51,6 @@ void ReadAsKinds(const std::string& content) {
       if (item % 3 == 2) (void)reader.Truth();
     });
   }
-}
-
-std::vector<std::vector<std::byte>> RecordsOf(const std::vector<std::byte>& bytes,
-                                              std::size_t length) {
-  std::vector<std::vector<std::byte>> records;
-  for (std::size_t place = 0; place + length <= bytes.size(); place += length) {
-    const auto begin = bytes.begin() + static_cast<std::ptrdiff_t>(place);
-    records.emplace_back(begin, begin + static_cast<std::ptrdiff_t>(length));
-  }
-  return records;
 }
 
 void SortAndCompare(MemoryFileSystem& files, Channels& channels) {

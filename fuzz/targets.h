@@ -15,6 +15,8 @@ using Input = std::span<const std::byte>;
 void SideFile(Input input);
 /// A player file and a results file, through the lists, the score sheet's findings and the sort.
 void Records(Input input);
+/// A ladder file and the rules of its table, through the table, its plain model and the sort.
+void Ladder(Input input);
 /// A text typed or read: as a number, a date, and between the code page and Unicode.
 void Words(Input input);
 

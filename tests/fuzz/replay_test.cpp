@@ -33,6 +33,7 @@ void Replay(const std::string& corpus, void (*target)(Input)) {
 
 TEST(FuzzReplay, SideFiles) { Replay("side_file", SideFile); }
 TEST(FuzzReplay, PlayersAndResults) { Replay("records", Records); }
+TEST(FuzzReplay, TheLadderAndItsRules) { Replay("ladder", Ladder); }
 TEST(FuzzReplay, Words) { Replay("words", Words); }
 
 }  // namespace

@@ -21,6 +21,7 @@ PictureButton::PictureButton(QWidget* parent) : QAbstractButton(parent) {
 void PictureButton::setIcon(const QString& name) {
   icon_name_ = name;
   picture_.load(":/icons/" + name + ".svg");
+  drawn_ = {};
   updateGeometry();
   update();
 }
@@ -57,17 +58,22 @@ void PictureButton::paintEvent(QPaintEvent* /*event*/) {
 
 /// A disabled picture fades as a whole: part by part, what lies behind would shine through.
 void PictureButton::PaintPicture(QPainter& painter) {
-  const QRectF area = PictureArea();
-  if (isEnabled()) return picture_.render(&painter, isDown() ? area.translated(1, 1) : area);
-  QPixmap whole(size() * devicePixelRatioF());
-  whole.setDevicePixelRatio(devicePixelRatioF());
-  whole.fill(Qt::transparent);
-  QPainter on(&whole);
-  picture_.render(&on, area);
-  on.end();
-  painter.setOpacity(kFaded);
-  painter.drawPixmap(0, 0, whole);
+  if (!isEnabled()) painter.setOpacity(kFaded);
+  painter.drawPixmap(isDown() ? QPoint(1, 1) : QPoint(0, 0), Drawn());
   painter.setOpacity(1);
+}
+
+/// The picture as it lies in the button. It is drawn anew for another size only: a menu of them
+/// takes longer to draw than most screens that come up over it.
+const QPixmap& PictureButton::Drawn() {
+  const QSize dots = size() * devicePixelRatioF();
+  if (drawn_.size() == dots) return drawn_;
+  drawn_ = QPixmap(dots);
+  drawn_.setDevicePixelRatio(devicePixelRatioF());
+  drawn_.fill(Qt::transparent);
+  QPainter on(&drawn_);
+  picture_.render(&on, PictureArea());
+  return drawn_;
 }
 
 /// The pointer's frame is full, the focus's is a thin one: the two may stand on one picture.

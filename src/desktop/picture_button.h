@@ -1,6 +1,7 @@
 #pragma once
 
 #include <QAbstractButton>
+#include <QPixmap>
 #include <QString>
 #include <QSvgRenderer>
 
@@ -30,10 +31,12 @@ class PictureButton : public QAbstractButton {
  private:
   [[nodiscard]] QRectF PictureArea() const;
   void PaintPicture(QPainter& painter);
+  const QPixmap& Drawn();
   void PaintFrame(QPainter& painter) const;
 
   QString icon_name_;
   QSvgRenderer picture_;
+  QPixmap drawn_;  ///< for the present size, once it has been needed
   bool bordered_ = false;
 };
 

@@ -2,7 +2,7 @@
 
 #include <algorithm>
 
-#include <QStringList>
+#include <QFontDatabase>
 
 #include "desktop/encoding.h"
 
@@ -11,11 +11,18 @@ namespace {
 
 constexpr int kTwipsPerPoint = 20;
 
-QFont Drawn(const PrinterFont& font) {
+/// What stands behind a font is of its kind: columns of characters stay columns.
+QStringList FamiliesFor(const PrinterFont& font) {
+  const QString name = ToQt(font.name);
+  if (name.startsWith("courier", Qt::CaseInsensitive)) return FixedPitchFamilies();
   QStringList families = {"Liberation Sans", "Arial"};
-  if (!HasStandIn(font.name)) families.prepend(ToQt(font.name));
+  if (!HasStandIn(font.name)) families.prepend(name);
+  return families;
+}
+
+QFont Drawn(const PrinterFont& font) {
   QFont drawn;
-  drawn.setFamilies(families);
+  drawn.setFamilies(FamiliesFor(font));
   drawn.setBold(font.bold);
   drawn.setItalic(font.italic);
   drawn.setUnderline(font.underline);
@@ -23,6 +30,11 @@ QFont Drawn(const PrinterFont& font) {
 }
 
 }  // namespace
+
+QStringList FixedPitchFamilies() {
+  return {"Courier New", "Liberation Mono", "DejaVu Sans Mono", "Consolas",
+          QFontDatabase::systemFont(QFontDatabase::FixedFont).family()};
+}
 
 bool HasStandIn(const std::string& name) { return name == "MS Sans Serif"; }
 

@@ -3,6 +3,7 @@
 #include <string>
 
 #include <QFont>
+#include <QStringList>
 
 #include "platform/printer.h"
 
@@ -14,6 +15,8 @@ namespace marlowbeck {
 /// Where one unit is a twip.
 [[nodiscard]] QFont FontInTwips(const PrinterFont& font);
 [[nodiscard]] QFont FontOnScreen(const PrinterFont& font);
+/// Faces whose characters are all of one width, for "Courier New" and its like.
+[[nodiscard]] QStringList FixedPitchFamilies();
 /// Whether another face is drawn for a font of this name, wherever it is.
 [[nodiscard]] bool HasStandIn(const std::string& name);
 

@@ -5,13 +5,14 @@
 #include <chrono>
 
 #include <QDateEdit>
-#include <QFontDatabase>
 #include <QPainter>
 #include <QPalette>
 #include <QProxyStyle>
 #include <QStyleFactory>
 #include <QStyleOption>
 #include <QTimer>
+
+#include "desktop/printer_font.h"
 
 namespace marlowbeck {
 namespace {
@@ -31,6 +32,7 @@ constexpr int kHeadingPoints = 15;
 constexpr int kHintPoints = 10;
 constexpr int kFigurePoints = 14;
 constexpr int kBigPoints = 20;
+constexpr double kChartPoints = 8.25;
 
 constexpr int kButtonHeight = 32;
 constexpr int kButtonWidth = 96;
@@ -39,6 +41,7 @@ constexpr int kMenuMargin = 8;
 constexpr int kEntryHeight = 30;
 constexpr int kLineHeight = 24;
 constexpr int kLineAir = 6;
+constexpr int kChartAir = 4;
 constexpr int kCardTitleIndent = 24;
 constexpr int kCardTitleAir = 8;  ///< above and below
 
@@ -74,6 +77,7 @@ class Style : public QProxyStyle {
         }
         return size.expandedTo({0, kEntryHeight});
       case CT_ItemViewItem:
+        if (Plays(widget, "fixed")) return size + QSize(0, kChartAir);
         // Some air tells a line that is broken in two from two lines.
         return (size + QSize(0, kLineAir)).expandedTo({0, kLineHeight});
       default:
@@ -233,6 +237,13 @@ void Dress(QWidget& widget, const Role& role) {
   widget.setPalette(palette);
 }
 
+QFont ChartFont() {
+  QFont font;
+  font.setFamilies(FixedPitchFamilies());
+  font.setPointSizeF(kChartPoints);
+  return font;
+}
+
 /// What comes and goes leaves its place empty, so that nothing else moves.
 void KeepRoom(QWidget& widget) {
   QSizePolicy policy = widget.sizePolicy();
@@ -260,9 +271,7 @@ void ApplyRoles(QWidget& window) {
     for (const Role& role : kRoles) {
       if (value.toString() == role.name) Dress(*widget, role);
     }
-    if (value.toString() == "fixed") {
-      widget->setFont(QFontDatabase::systemFont(QFontDatabase::FixedFont));
-    }
+    if (value.toString() == "fixed") widget->setFont(ChartFont());
   }
 }
 

@@ -17,6 +17,11 @@ std::string_view OrientationWord(Orientation orientation) {
   return orientation == Orientation::Portrait ? "Portrait" : "Landscape";
 }
 
+void AskForOrientation(Platform& platform) {
+  const auto chosen = platform.dialogs.PrinterSetup(platform.printer.GetOrientation());
+  if (chosen) platform.printer.SetOrientation(*chosen);
+}
+
 void PrintPanel::PrinterInfo() {
   Printer& printer = context_.platform.printer;
   controls_.printer_name.SetCaption(printer.DeviceName());
@@ -36,9 +41,7 @@ void PrintPanel::Open() {
 }
 
 void PrintPanel::SetUpPrinter() {
-  Printer& printer = context_.platform.printer;
-  const auto chosen = context_.platform.dialogs.PrinterSetup(printer.GetOrientation());
-  if (chosen) printer.SetOrientation(*chosen);
+  AskForOrientation(context_.platform);
   PrinterInfo();
 }
 

@@ -12,6 +12,9 @@ namespace marlowbeck {
 /// "Portrait" or "Landscape".
 [[nodiscard]] std::string_view OrientationWord(Orientation orientation);
 
+/// The set-up dialog; a cancelled one leaves the printer as it was.
+void AskForOrientation(Platform& platform);
+
 /// What the print panels of all screens do alike, on the controls that each of them has. The screen
 /// shows and hides the panel itself, and says what is printed.
 class PrintPanel {
@@ -30,7 +33,7 @@ class PrintPanel {
   void PrinterInfo();
   /// As the panel comes up: the printer, one copy, a beep, the distances with the first selected.
   void Open();
-  /// The set-up dialog; a cancelled one leaves the printer as it was.
+  /// The set-up dialog, and what has come of it.
   void SetUpPrinter();
 
   /// Whether one of the options is selected, `none_selected` being said where it is not, and the

@@ -2,6 +2,7 @@
 
 #include <memory>
 
+#include "fixtures/frmFixtures.h"
 #include "ladder/frmLadder.h"
 #include "results/frmChangeDate.h"
 #include "results/frmEdScore.h"
@@ -47,6 +48,7 @@ void RegisterScreens(Screens& screens, const Context& context) {
   Register<frmPegRatio>(screens, "frmPegRatio", context);
   Register<frmPlayersLists>(screens, "frmPlayersLists", context);
   Register<frmSearchPlayer>(screens, "frmSearchPlayer", context);
+  Register<frmFixtures>(screens, "frmFixtures", context);
   Register<frmErrors>(screens, "frmErrors", context);
 }
 

@@ -1,20 +1,14 @@
 // The main menu's ways to the other screens.
 
 #include "data/competition.h"
-#include "data/numbers.h"
 #include "data/text.h"
 #include "session/association.h"
+#include "session/fixture_entry.h"
 #include "session/frmDB.h"
 #include "session/shared_procedures.h"
 #include "ui/screens.h"
 
 namespace marlowbeck {
-namespace {
-
-constexpr int kFewestTeams = 3;
-constexpr int kMostTeams = 50;
-
-}  // namespace
 
 void frmDB::AddPlayers() {
   Menus();
@@ -96,22 +90,12 @@ void frmDB::imgbackup_Click() {
 
 void frmDB::mnuFix_Click() {
   Menus();
-  for (;;) {
-    const std::string reply = context_.platform.boxes.Input(
-        {Lines({"Accepted range for this fixture", "generator is from 3 to 50.", "", "",
-                "How many teams in the fixture ?"}),
-         "(Marlowbeck) Fixture Generator",
-         {},
-         {}});
-    const Integer teams = Integer::Narrow(Val(reply));
-    if (teams < 1) return;
-    if (teams >= kFewestTeams && teams <= kMostTeams) {
-      InScreens().Show("frmFixtures");
-      return;
-    }
-    Warning(context_, Lines({"Accepted range is from 3 to 50,    ", "Please try again.    "}),
-            Beep::First);
-  }
+  if (!AskTeamCount(context_, Beep::First)) return;
+  Screen* const fixtures = InScreens().Load("frmFixtures");
+  if (fixtures == nullptr) return;
+  SetEnabled(false);
+  fixtures->Closed = [this] { SetEnabled(true); };
+  InScreens().Show("frmFixtures");
 }
 
 void frmDB::mnuSearchPlayer_Click() {

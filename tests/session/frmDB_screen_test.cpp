@@ -418,7 +418,9 @@ TEST_F(MainMenu, FixtureBoxComesBackUntilTheNumberIsInRange) {
   EXPECT_EQ(EventsNamed("input").at(0)["title"], "(Marlowbeck) Fixture Generator");
   EXPECT_EQ(EventsNamed("input").at(0)["prompt"],
             "Accepted range for this fixture\rgenerator is from 3 to 50.\r\r\r"
-            "How many teams in the fixture ?");
+            "How many teams in the fixture ?\r");
+  EXPECT_EQ(EventsNamed("input").at(0)["default"], "0");
+  EXPECT_EQ(Count("beep"), 2);
 }
 
 TEST_F(MainMenu, FixtureReplyThatIsNoNumberReadsAsNothing) {

@@ -23,6 +23,9 @@ constexpr const char* kHeadless = "headless";
 /// A property of the form: the room is parted among the columns in these shares.
 constexpr const char* kColumnShares = "columnShares";
 
+/// A property of the form: the first column counts the rows, and is one of figures.
+constexpr const char* kNumbered = "numbered";
+
 constexpr int kRowHeight = 24;  // pixels
 constexpr int kAir = 8;         ///< between columns, at the least
 constexpr int kLeastNames = 120;
@@ -62,7 +65,8 @@ GridView::GridView(Grid& control, QTableWidget* table, Windows& windows)
     : CaptionedView(control, table, windows),
       model_(control),
       table_(*table),
-      heading_rows_(table->property(kHeadless).toBool() ? 0 : 1) {
+      heading_rows_(table->property(kHeadless).toBool() ? 0 : 1),
+      first_names_(table->property(kNumbered).toBool() ? 1 : 0) {
   table_.setItemDelegate(new RuledDelegate(table));
   table_.setShowGrid(false);
   table_.setAlternatingRowColors(true);
@@ -81,7 +85,8 @@ GridView::GridView(Grid& control, QTableWidget* table, Windows& windows)
 }
 
 Qt::Alignment GridView::AlignmentOf(int col) const {
-  return Qt::AlignVCenter | (col >= model_.FiguresFrom() ? Qt::AlignRight : Qt::AlignLeft);
+  const bool figures = col < first_names_ || col >= model_.FiguresFrom();
+  return Qt::AlignVCenter | (figures ? Qt::AlignRight : Qt::AlignLeft);
 }
 
 void GridView::ShowKind() {
@@ -98,8 +103,8 @@ void GridView::ShowKind() {
   ShowCurrent();
 }
 
-/// As wide as the widest cell, and what is left is shared out. Where the room is short, names are
-/// broken into two lines before anything has to be scrolled.
+/// As wide as the widest cell, and what is left is shared out, but not to numbers. Where the room
+/// is short, names are broken into two lines before anything has to be scrolled.
 void GridView::FitColumns() {
   const int cols = table_.columnCount();
   if (cols == 0) return;
@@ -107,12 +112,16 @@ void GridView::FitColumns() {
   std::vector<int> widths;
   widths.reserve(static_cast<std::size_t>(cols));
   for (int col = 0; col < cols; ++col) widths.push_back(WidthOfColumn(col));
-  const int spare = table_.viewport()->width() - std::accumulate(widths.begin(), widths.end(), 0);
-  if (spare >= 0) {
-    for (int col = 0; col < cols; ++col)
-      widths[AsIndex(col)] += spare / cols + (col < spare % cols);
-  } else if (model_.FiguresFrom() > 0) {
-    widths[0] = std::max(widths[0] + spare, std::min(widths[0], LeastWidthOfNames()));
+  int spare = table_.viewport()->width() - std::accumulate(widths.begin(), widths.end(), 0);
+  const int sharing = cols - first_names_;
+  for (int col = first_names_; spare > 0 && col < cols; ++col) {
+    widths[AsIndex(col)] += spare / sharing + (col - first_names_ < spare % sharing);
+  }
+  for (int col = first_names_; spare < 0 && col < std::min(cols, model_.FiguresFrom()); ++col) {
+    int& width = widths[AsIndex(col)];
+    const int full = width;
+    width = std::max(full + spare, std::min(full, LeastWidthOfNames(col)));
+    spare += full - width;
   }
   for (int col = 0; col < cols; ++col) table_.setColumnWidth(col, widths[AsIndex(col)]);
   FitRows();
@@ -150,11 +159,11 @@ int GridView::WidthOfColumn(int col) const {
 }
 
 /// No word is broken.
-int GridView::LeastWidthOfNames() const {
+int GridView::LeastWidthOfNames(int col) const {
   static const QRegularExpression kBreak("(?<=-)|\\s");
   int least = kLeastNames;
   for (int row = 0; row < table_.rowCount(); ++row) {
-    for (const QString& word : table_.item(row, 0)->text().split(kBreak)) {
+    for (const QString& word : table_.item(row, col)->text().split(kBreak)) {
       least = std::max(least, table_.fontMetrics().horizontalAdvance(word) + 2 * kAir);
     }
   }

@@ -9,7 +9,7 @@ namespace marlowbeck {
 
 /// A grid: its heading row is a header that stays, names stand left and figures right. A table of
 /// the form whose property `leastRows` is a number shows that many of its rows in any window, and
-/// is never higher than all of them.
+/// is never higher than all of them. One that is `numbered` counts its rows in the first column.
 class GridView : public CaptionedView {
  public:
   GridView(Grid& control, QTableWidget* table, Windows& windows);
@@ -32,7 +32,7 @@ class GridView : public CaptionedView {
   /// A table hides its measures, which are every view's.
   [[nodiscard]] const QAbstractItemView& AsView() const { return table_; }
   [[nodiscard]] int WidthOfColumn(int col) const;
-  [[nodiscard]] int LeastWidthOfNames() const;
+  [[nodiscard]] int LeastWidthOfNames(int col) const;
   void ShowCurrent();
   void PressCell(int row, int col);
   [[nodiscard]] Qt::Alignment AlignmentOf(int col) const;
@@ -40,6 +40,7 @@ class GridView : public CaptionedView {
   Grid& model_;
   QTableWidget& table_;
   int heading_rows_;  ///< 1, or 0 in a table without a heading
+  int first_names_;   ///< 0, or 1 in a table whose first column counts the rows
   std::vector<std::vector<std::string>> shown_cells_;
   int shown_figures_from_ = -1;
 };

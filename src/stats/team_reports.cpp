@@ -2,7 +2,7 @@
 
 #include <utility>
 
-#include "data/competition.h"
+#include "stats/read_records.h"
 #include "stats/team_dates.h"
 
 namespace marlowbeck {
@@ -10,20 +10,6 @@ namespace {
 
 constexpr const char* kWeeklyFile = "weekly.qz3";
 constexpr const char* kProgressiveFile = "progweek.qz3";
-
-template <typename Take>
-void ReadPlayers(Session& session, Channels& channels, Take take) {
-  OpenFile(session, channels);
-  channels.ForEachRecord(Channel::Players, [&](Bytes bytes, int) { take(PlayerView(bytes)); });
-  channels.Close(Channel::Players);
-}
-
-template <typename Take>
-void ReadResults(Session& session, Channels& channels, Take take) {
-  OpenResultSFile(session, channels);
-  channels.ForEachRecord(Channel::Results, [&](Bytes bytes, int) { take(ResultView(bytes)); });
-  channels.Close(Channel::Results);
-}
 
 }  // namespace
 

@@ -25,10 +25,14 @@ frmPMenu::frmPMenu(Screens& screens, const Context& context)
   imgBall.SetTabStop(false);
   WireMenu();
   WireWeekly();
+  WireHighest();
+  WireCombined();
   WirePrinting();
-  Defaults = {&cmdBothOK};
-  Cancels = {&cmdBothCancel, &cmdCancelWK, &Image10};
-  Helps = {&cmdWeekHelp, &cmdPlrResExit};
+  WireListPrinting();
+  WireCopying();
+  Defaults = {&cmdBothOK, &cmdBothOKHI};
+  Cancels = {&cmdBothCancel, &cmdBothCancelHI, &cmdCancelWK, &cmdHiMenu, &Image10};
+  Helps = {&cmdWeekHelp, &cmdPlrResExit, &cmdExitHi};
 }
 
 void frmPMenu::WireMenu() {
@@ -86,6 +90,21 @@ void frmPMenu::Unload() {
     throw;
   }
   InScreens().Show("frmDB");
+}
+
+/// Once the panel of the lists has gone, nothing on the screen leads anywhere.
+bool frmPMenu::AtDeadEnd() const {
+  return !fraMenu.Visible() && !fraWeek.Visible() && !fraPikHi.Visible();
+}
+
+void frmPMenu::CloseButton() {
+  if (AtDeadEnd()) return cmdHiMenu_Click();
+  Screen::CloseButton();
+}
+
+void frmPMenu::Escape() {
+  if (AtDeadEnd()) return cmdHiMenu_Click();
+  Screen::Escape();
 }
 
 void frmPMenu::StartScreen() {

@@ -60,13 +60,26 @@ struct frmPMenu : Screen {
 
   Label lblNoneFound{*this, "lblNoneFound"};
 
-  // The lists of the highest.
+  // The lists of the highest, one grade at a time or all together.
   Label lblSeason{*this, "lblSeason"};
   Panel fraPikHi{*this, "fraPikHi"};
-  Panel fraHi{*this, "fraHi"};
-  Command cmdHcap{fraHi, "cmdHcap", "Handicaps"};
-  Command cmdReDoAvgs{*this, "cmdReDoAvgs", "List "};
+  ComboBox cboHiGrade{fraPikHi, "cboHiGrade", "Select Grade:"};
+  ListBox lstHiDates{fraPikHi, "lstHiDates", "Select Date:"};
+  static constexpr const char* kProgressive = "Progressive";
+  Command cmdProgress{fraPikHi, "cmdProgress", kProgressive};
+  Command cmdCombine{fraPikHi, "cmdCombine", "Combine All Grades"};
+  Command cmdHiPrint{fraPikHi, "cmdHiPrint", "Print"};
+  Command cmdClipHi{fraPikHi, "cmdClipHi", "Copy to Clipboard"};
+  Command cmdExitHi{fraPikHi, "cmdExitHi", "Help"};
+  Command cmdHiMenu{fraPikHi, "cmdHiMenu", "Exit"};
   Panel FraCombineOptions{*this, "FraCombineOptions"};
+  OptionButton optCombineAvg{FraCombineOptions, "optCombineAvg", "List by Average"};
+  OptionButton optCombineAlpha{FraCombineOptions, "optCombineAlpha", "Alphabetical List"};
+  Command cmdReDoAvgs{*this, "cmdReDoAvgs", "List "};
+  Panel fraHi{*this, "fraHi"};
+  std::array<Label, 2> lblHi = {Label{fraHi, "lblHi(0)"}, Label{fraHi, "lblHi(1)"}};
+  Command cmdHcap{fraHi, "cmdHcap", "Handicaps"};
+  Grid grdHI{fraHi, "grdHI"};
 
   // The printer font and the print panels.
   Panel fraFontPick{*this, "fraFontPick", "Printer Font"};
@@ -88,10 +101,23 @@ struct frmPMenu : Screen {
   Command cmdBothOK{picPrint, "cmdBothOK", "Print"};
   Command cmdBothCancel{picPrint, "cmdBothCancel", "Cancel"};
   Panel picPrintHI{*this, "picPrintHI", "Print Options"};
+  Label lblPrinterNameHI{picPrintHI, "lblPrinterNameHI"};
+  Label lblOrientHI{picPrintHI, "lblOrientHI"};
+  std::array<OptionButton, 2> optHI = {
+      OptionButton{picPrintHI, "optHI(0)"},
+      OptionButton{picPrintHI, "optHI(1)", "Enter another amount to Print"}};
+  TextBox txtHI{picPrintHI, "txtHI"};
+  Label lblHMPrint{picPrintHI, "lblHMPrint"};
+  TextBox txtNoCHI{picPrintHI, "txtNoCHI", "Number of Copies:"};
+  Command cmdPrinterSetupHI{picPrintHI, "cmdPrinterSetupHI", "Printer Setup"};
+  Command cmdBothOKHI{picPrintHI, "cmdBothOKHI", "Print"};
+  Command cmdBothCancelHI{picPrintHI, "cmdBothCancelHI", "Cancel"};
 
   void Load() override;
   void Activate() override;
   void Unload() override;
+  void CloseButton() override;
+  void Escape() override;
 
   // The menu.
   void StartScreen();
@@ -124,6 +150,29 @@ struct frmPMenu : Screen {
   void optFFyes_Click();
   void optFFno_Click();
 
+  // The lists of the highest.
+  void DoHighest();
+  void ListGrades();
+  void GetHiDates();
+  void ListDateOnly();
+  void CalcHi();
+  void CalcHiProg();
+  void GridHi();
+  void ClearGridHi();
+  void lstHiDates_Click();
+  void cmdProgress_Click();
+  void cmdExitHi_Click();
+  void cmdHiMenu_Click();
+
+  // All grades together, and handicaps.
+  void cmdCombine_Click();
+  void CombineStart();
+  void CombineAV();
+  void CombineSort();
+  void CombineShow();
+  void cmdReDoAvgs_Click();
+  void cmdHcap_Click();
+
   // Printing of the two tables.
   void cmdPrintLad_Click();
   void cmdPrinterSetup_Click();
@@ -132,10 +181,26 @@ struct frmPMenu : Screen {
   void PrintProg();
   void PrintBoth();
 
+  // Printing of a list.
+  void cmdHiPrint_Click();
+  void optHI0_Click();
+  void optHI1_Click();
+  void txtHI_Change();
+  void cmdBothOKHI_Click();
+  void PrintHI();
+
+  // Copies for a spreadsheet.
+  void cmdClipWeek_Click();
+  void cmdClipHi_Click();
+
  private:
   void WireMenu();
   void WireWeekly();
+  void WireHighest();
+  void WireCombined();
   void WirePrinting();
+  void WireListPrinting();
+  void WireCopying();
   void ClosePrintPanel();
   [[nodiscard]] std::array<Picture*, 11> Entries();
   void TakeSelection();
@@ -143,6 +208,18 @@ struct frmPMenu : Screen {
   void OfferNight(bool any);
   void ForgetNight();
   void KeepForfeitsChoice(bool included);
+  void OpenList(int choice, const std::string& name);
+  void OfferList(bool any);
+  void ShowListPanel();
+  void ListUpToDate();
+  void ShowNoneFound();
+  void NameCombine();
+  void PickCombinedOrder(OptionButton& picked);
+  [[nodiscard]] bool IsAverages() const;
+  [[nodiscard]] bool AtDeadEnd() const;
+  [[nodiscard]] int ListedRows() const;
+  void RefillList(const Handler& refill);
+  void CloseListPrintPanel();
   void OpenReport(int choice, std::string_view screen);
   /// Hides this screen and shows another, where there is such a screen.
   void GoTo(std::string_view screen);
@@ -153,6 +230,7 @@ struct frmPMenu : Screen {
   const Context& context_;
   Session& session_;
   PrintPanel print_panel_{context_, {lblPrinterName, lblOrient, txtNoC, &cboFromTop}};
+  PrintPanel list_print_panel_{context_, {lblPrinterNameHI, lblOrientHI, txtNoCHI}};
   FontBox font_box_{context_, {fraFontPick, lblFont, lblPrFont, lblFontInfo}};
   TeamReports reports_;
   std::vector<ProgressiveRow> progressive_;  ///< the rows of the last CalcProg

@@ -41,16 +41,6 @@ TEST_F(ReportsMenu, BallStandsAtTheEntryUnderThePointer) {
   EXPECT_FALSE(Shown("imgBall"));
 }
 
-TEST_F(ReportsMenu, EntriesOfReportsThatAreNotThereOpenNothing) {
-  LayRovers();
-  OpenReports();
-  for (const char* entry : {"Image1", "Image3", "Image2", "Image4", "Image5", "Image9"}) {
-    Do(std::string("click ") + entry);
-    EXPECT_EQ(Front(), "frmPMenu") << entry;
-    ExpectMenu();
-  }
-}
-
 TEST_F(ReportsMenu, NameSearchAsksForASurname) {
   LayRovers();
   OpenReports();

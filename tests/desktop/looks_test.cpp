@@ -4,8 +4,12 @@
 #include <QComboBox>
 #include <QLabel>
 #include <QLineEdit>
+#include <QListWidget>
 #include <QPushButton>
+#include <QScrollBar>
+#include <QTableWidget>
 
+#include "support/record_files.h"
 #include "tests/desktop/window_club.h"
 
 namespace marlowbeck {
@@ -53,6 +57,28 @@ TEST_F(Looks, TheLongestNamesCanBeReadWhereFiguresAreCorrected) {
   }
   EXPECT_LE(WindowOf("frmEdScore")->width(), 800);
   EXPECT_LE(WindowOf("frmEdScore")->height(), 600);
+}
+
+TEST_F(Looks, ALadderOfLongNamesShowsAllItsColumnsInTheSmallestWindow) {
+  std::vector<PlayerRecord> players;
+  for (int id = 1; id <= 14; ++id) {
+    const std::string team = "The Wandering Woolwich Team " + std::to_string(id);
+    players.push_back(Player(id, "Archer", "Jo", team, "A Grade"));
+  }
+  club_.WritePlayers("Winter.qza", players);
+  std::vector<LadderRecord> matches(40);
+  for (std::size_t i = 0; i < matches.size(); ++i) {
+    matches[i].GameDate = Date{38028.0 + 7.0 * static_cast<double>(i)};
+  }
+  club_.WriteFile("Winter_A Grade.qzl", FileOf(matches));
+  club_.DoAll({"click imgLadder", "click cmdGotoResults", "click cmdPL",
+               "shot {folder}/ladder.png 800 600"});
+  const QTableWidget& table = club_.Find<QTableWidget>("grdLad");
+  EXPECT_GT(table.verticalScrollBar()->maximum(), 0) << "as wide as it can get";
+  EXPECT_EQ(table.horizontalScrollBar()->maximum(), 0);
+  const QListWidget& dates = club_.Find<QListWidget>("lstTableDates");
+  EXPECT_GT(dates.verticalScrollBar()->maximum(), 0);
+  EXPECT_EQ(dates.horizontalScrollBar()->maximum(), 0);
 }
 
 TEST_F(Looks, TheLongestNamesBreakWhereADateIsChanged) {

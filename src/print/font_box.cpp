@@ -58,8 +58,8 @@ void FontBox::Choose() {
   const PrinterFont font = PrinterFontOf(context_.session);
   const FontChoice present = {font.name, font.size, font.bold, font.italic};
   Take(context_.platform.dialogs.Font(present).value_or(present));
+  AlignFontBox();  // it holds, though it may not come to be kept
   WriteFontSettings(context_);
-  AlignFontBox();
 }
 
 void FontBox::Take(const FontChoice& chosen) {

@@ -1,3 +1,4 @@
+#include "ladder/frmLadder.h"
 #include "ladder/ladder_league.h"
 
 namespace marlowbeck {
@@ -74,10 +75,42 @@ TEST_F(LadderOpening, CaptionsAreTheirOwn) {
       {"Label13", "Team:"},
       {"Label14", "Date:"},
       {"fraFontPick", "Printer Font"},
+      {"lblFontInfo", " Click to change font. "},
       {"fraPO", "Printer Options"},
+      {"optBoth(0)", "        Game Results ONLY"},
+      {"optBoth(1)", "Premiership Ladder ONLY"},
+      {"optBoth(2)", "  BOTH Results and Ladder"},
+      {"Label8", "How many Centimeters from Top of Page ?"},
+      {"lblCopies", "Number of Copies:"},
+      {"lblPrinter", "Printer:"},
+      {"Label15", "Orientation:"},
+      {"cmdPrinterSetup", "Printer Setup"},
+      {"SSCommand5", "Help"},
+      {"cmdBothOK", "Print"},
+      {"cmdBothCancel", "Cancel"},
+      {"cmdHelp1", "Help"},
+      {"fraPenPts", "Adjust Points"},
+      {"fraConfig", "Configuration"},
+      {"cmdCancel", "Cancel"},
       {"cmdSaveConfig", "Save"},
       {"cmdExitLadder", "Exit"}};
   for (const auto& [control, caption] : captions) EXPECT_EQ(Caption(control), caption) << control;
+}
+
+TEST_F(LadderOpening, BoxesHaveTheirLabels) {
+  Do("click imgLadder");
+  auto& screen = static_cast<frmLadder&>(*ScreensOf().Find("frmLadder"));
+  const std::vector<std::pair<const Control*, const char*>> labels = {
+      {&screen.cfgGrade, "Current Grade:"},
+      {&screen.cfgGames, "Games played in a Match:"},
+      {&screen.cfgWin, "Points for a Win:"},
+      {&screen.cfgLoss, "Points for a Loss:"},
+      {&screen.cfgDraw, "Points for a Draw:"},
+      {&screen.cfgFinals, "Number of Teams to play in Finals:"},
+      {&screen.txtEdHome, "Home Team:"},
+      {&screen.txtEdAway, "Away Team:"},
+      {&screen.EdCal, "Change the game date here before saving if required."}};
+  for (const auto& [box, label] : labels) EXPECT_EQ(box->Caption(), label) << box->Name();
 }
 
 TEST_F(LadderOpening, WithoutAWorkDateTodayIsTaken) {

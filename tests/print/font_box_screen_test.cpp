@@ -110,6 +110,16 @@ TEST_F(FontBoxScreen, ACancelledDialogChangesNothing) {
   ExpectKept("12,\"Liberation Serif\",#TRUE#,#FALSE#");
 }
 
+TEST_F(FontBoxScreen, AChoiceThatCannotBeKeptHoldsAndIsShown) {
+  HOLDS_FOR_MODELS_ALONE("the fault is one of files");
+  Open();
+  DoAll({"font 14 0 1 Liberation Serif", "fault write 1 61", "click lblFont"});
+  EXPECT_EQ(Count("error"), 1);
+  EXPECT_EQ(InSession("PrintFontSize"), 14);
+  EXPECT_EQ(Caption("lblFont"), "Liberation Serif");
+  EXPECT_EQ(Caption("lblPrFont"), "Font size = 14pts.");
+}
+
 TEST_F(FontBoxScreen, AFontFileThatNamesNoFontIsWrittenAnew) {
   for (const char* bad : {"0,\"Sans\",#FALSE#,#FALSE#\r\n", "-3,\"Sans\",#FALSE#,#FALSE#\r\n",
                           "10,\"\",#FALSE#,#FALSE#\r\n"}) {

@@ -165,6 +165,52 @@ TEST(LadderRows, EveryFigureOverflowsAtSixteenBits) {
   EXPECT_EQ(ErrorOf([&] { (void)Tallied({"Alpha"}, wins, rich); }), 6);
 }
 
+TEST(LadderRows, AFigureThatLeavesSixteenBitsOnTheWayIsAnOverflowThoughItComesBack) {
+  const auto points = [](int given) {
+    return Adjusted(MatchOn(3, "Alpha", 1, "Gone", 0), given, 0);
+  };
+  const auto games = [](int own, int other) { return MatchOn(3, "Alpha", own, "Gone", other); };
+  const std::vector<Matches> leave = {{games(328, 1), games(-10, 1)},
+                                      {games(-328, 1), games(10, 1)},
+                                      {games(0, 20000), games(0, 20000), games(0, -20000)},
+                                      {games(0, -20000), games(0, -20000), games(0, 20000)},
+                                      {points(30000), points(30000), points(-30000)},
+                                      {points(-30000), points(-30000), points(30000)}};
+  for (std::size_t i = 0; i < leave.size(); ++i) {
+    SCOPED_TRACE(i);
+    EXPECT_EQ(ErrorOf([&] { (void)Tallied({"Alpha"}, leave[i]); }), 6);
+    EXPECT_THROW((void)PlainLadder({"Alpha"}, leave[i], {}, March(31)), PlainOverflow);
+  }
+  const Matches stay = {games(327, 1), games(-654, 32000), games(0, 766), points(32763)};
+  EXPECT_EQ(PlainOf(Tallied({"Alpha"}, stay)), PlainLadder({"Alpha"}, stay, {}, March(31)));
+}
+
+TEST(LadderRows, MoreMatchesThanSixteenBitsCountAreAnOverflow) {
+  // Against itself a team plays twice. Points for nothing, so that they stay at 0.
+  LadderRules rules;
+  rules.WinPoints = rules.LossPoints = rules.DrawPoints = 0;
+  Matches matches(16384, MatchOn(3, "Alpha", 0, "Alpha", 0));
+  EXPECT_EQ(ErrorOf([&] { (void)Tallied({"Alpha"}, matches, rules); }), 6);
+  matches.back().AwayTeam = "Gone";
+  EXPECT_EQ(Tallied({"Alpha"}, matches, rules)[0].Played, 32767);
+}
+
+TEST(LadderRows, PointsForLossesAndDrawsOverflowAsThoseForWinsDo) {
+  LadderRules rules;
+  rules.WinPoints = 0;
+  rules.LossPoints = -20000;
+  rules.DrawPoints = 20000;
+  const Matches losses(2, MatchOn(3, "Alpha", 0, "Gone", 1));
+  const Matches draws(2, MatchOn(3, "Alpha", 1, "Gone", 1));
+  EXPECT_EQ(ErrorOf([&] { (void)Tallied({"Alpha"}, losses, rules); }), 6);
+  EXPECT_EQ(ErrorOf([&] { (void)Tallied({"Alpha"}, draws, rules); }), 6);
+  // Each of the two is too much by itself, though together they are nothing.
+  Matches both = losses;
+  both.insert(both.end(), draws.begin(), draws.end());
+  EXPECT_EQ(ErrorOf([&] { (void)Tallied({"Alpha"}, both, rules); }), 6);
+  EXPECT_EQ(Tallied({"Alpha"}, {losses[0], draws[0]}, rules)[0].Points, 0);
+}
+
 TEST(LadderRows, AnOverflowAfterTheDateOrOfATeamNobodyKnowsIsNone) {
   const Matches matches = {MatchOn(4, "Alpha", 400, "Gone", 1), MatchOn(3, "Gone", 400, "Lost", 1)};
   EXPECT_EQ(Tallied({"Alpha"}, matches, {}, March(3))[0].Played, 0);

@@ -185,6 +185,17 @@ TEST(LadderRows, AFigureThatLeavesSixteenBitsOnTheWayIsAnOverflowThoughItComesBa
   EXPECT_EQ(PlainOf(Tallied({"Alpha"}, stay)), PlainLadder({"Alpha"}, stay, {}, March(31)));
 }
 
+TEST(LadderRows, PointsThatLeaveSixteenBitsOnTheWayAreAnOverflowThoughTheyComeBack) {
+  LadderRules rules;
+  rules.WinPoints = 10000;
+  const LadderRecord win = MatchOn(3, "Alpha", 1, "Gone", 0);
+  const LadderRecord loss = MatchOn(3, "Alpha", 0, "Gone", 1);
+  const Matches before = {win, win, win, Adjusted(loss, 2768, 0), Adjusted(loss, -2768, 0)};
+  EXPECT_EQ(ErrorOf([&] { (void)Tallied({"Alpha"}, before, rules); }), 6);
+  const Matches within = {win, win, win, Adjusted(loss, 2767, 0), Adjusted(loss, -2767, 0)};
+  EXPECT_EQ(Tallied({"Alpha"}, within, rules)[0].Points, 30000);
+}
+
 TEST(LadderRows, MoreMatchesThanSixteenBitsCountAreAnOverflow) {
   // Against itself a team plays twice. Points for nothing, so that they stay at 0.
   LadderRules rules;

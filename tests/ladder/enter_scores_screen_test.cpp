@@ -134,6 +134,13 @@ TEST_F(LadderEntry, TheAwayTeamGoesBackBehindTheHomeTeam) {
   EXPECT_EQ(Lines("lstTeams").size(), 4U);
 }
 
+TEST_F(LadderEntry, TheAwayTeamTakesAHomeScoreWithoutATeamAlong) {
+  OpenScores(24);
+  TypeMatch("Alpha", "6", "Bravo", "5");
+  DoAll({"click cmdHomeBack", "type txtHomeScore 3", "click cmdBackAway"});
+  EXPECT_EQ(Text("txtHomeScore"), "");
+}
+
 TEST_F(LadderEntry, AMatchCanBeSavedOnceAllFourBoxesHoldSomething) {
   OpenScores(24);
   DoAll({"pick lstTeams =Alpha", "pick lstTeams =Bravo"});

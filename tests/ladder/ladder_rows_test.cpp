@@ -371,6 +371,22 @@ TEST(LadderRows, EqualTeamsStayWhereThePassesLeaveThem) {
   }
 }
 
+TEST(LadderRows, NamesThatDifferInAnyOneLetterAreTwoTeams) {
+  for (std::size_t letter = 0; letter < 30; ++letter) {
+    const std::string one = "The Wandering Woolwich Wombats";
+    std::string other = one;
+    other[letter] = '~';
+    const auto rows = Tallied({one, other}, {MatchOn(3, one, 6, other, 5)});
+    EXPECT_EQ(rows[0].For, 6) << letter;
+    EXPECT_EQ(rows[1].For, 5) << letter;
+  }
+}
+
+TEST(LadderRows, ANameOfNothingButZerosIsNobody) {
+  const std::string zeros(30, '\0');
+  EXPECT_EQ(Tallied({"Alpha"}, {MatchOn(3, zeros, 6, "Alpha", 5)})[0].Played, 1);
+}
+
 TEST(LadderRows, ThousandsOfNamesThatNobodyKnowsDoNotMisleadIt) {
   // Names that share their places in whatever remembers them.
   Matches matches;

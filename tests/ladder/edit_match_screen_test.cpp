@@ -36,6 +36,16 @@ TEST_F(LadderEditing, AClickBesideTheMatchesOpensNone) {
   EXPECT_EQ(InSession("EditRecord"), 0);
 }
 
+TEST_F(LadderEditing, AClickBesideTheMatchesOpensNoneOfABlankHomeTeamEither) {
+  WriteFile(kLadderOfA, FileOf(std::vector{MatchOn(17, "", 0, "Alpha", 0)}));
+  OpenScores();
+  Do("click lstDone");
+  EXPECT_FALSE(Shown("fraEdScore"));
+  // Its name of nothing stands in every line.
+  Do("pick lstDone 0");
+  EXPECT_EQ(Boxed(), (TextList{"", "0", "Alpha", "0"}));
+}
+
 TEST_F(LadderEditing, AMatchJustSavedOpensByItsLine) {
   OpenScores(24);
   TypeMatch("Alpha", "B", "Bravo", "11");
@@ -48,6 +58,7 @@ TEST_F(LadderEditing, KeptAHomeTeamIsFoundAnywhereInTheLineAndTheLastMatchCounts
            {MatchOn(17, "Redcliffe", 6, "Kings", 5), MatchOn(17, "Red", 6, "Queens", 5)});
   OpenMatch(0);
   EXPECT_EQ(Boxed()[0], "Red");
+  EXPECT_EQ(InSession("EditRecord"), 2);
   Do("click cmdCancelEdit");
   Do("pick lstDone 1");
   EXPECT_EQ(Boxed()[0], "Red");

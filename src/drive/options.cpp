@@ -25,6 +25,7 @@ fs::path WholePath(const std::string& folder) {
 /// Makes a folder unless it is there and answers its path as the program names it. Throws
 /// CLI::ValidationError when it can be neither.
 std::string MakeWorkingFolder(const std::string& folder) {
+  if (folder.empty()) throw CLI::ValidationError("FOLDER", "has no name");
   const fs::path whole = WholePath(folder);
   const std::string text = TextOfPath(whole);
   const std::u8string utf8 = whole.u8string();

@@ -74,8 +74,7 @@ void frmResults::Load() {
 void frmResults::Activate() {
   // What another screen has left in it is no failed check of this one.
   context_.session.Flag = 0;
-  // The setup may have added grades and teams, and the main menu opened another competition.
-  if (std::exchange(away_in_setup_, false)) Start();
+  if (const auto left = std::exchange(away_from_, std::nullopt)) StartAgain(*left);
 }
 
 void frmResults::HelpKey() { OpenHelp(SSCommand1.Live() ? kHelpTopicOfAdding : kHelpTopic); }

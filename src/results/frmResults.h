@@ -95,6 +95,7 @@ struct frmResults : Screen {
 
   // Grade and date.
   void Start();
+  void StartAgain(const std::string& competition);
   void StartScores();
   void UpdateTeamsInfo();
   void cmdExit_Click();
@@ -195,7 +196,8 @@ struct frmResults : Screen {
   void OpenHelp(int topic);
 
   const Context& context_;
-  bool away_in_setup_ = false;  ///< gone to add a team that the grade lacks
+  /// Gone to add a team that a grade of this competition lacks.
+  std::optional<std::string> away_from_;
   /// The one record buffer of the screen, in which readings of the results file leave their last
   /// record, and those of an empty file blanks; always read anew before a sheet opens.
   ResultRecord record_;

@@ -1,6 +1,8 @@
 // Opening and closing a score sheet: the player, the boxes that his grade has, and the figures of a
 // saved one.
 
+#include <algorithm>
+
 #include "data/competition.h"
 #include "data/numbers.h"
 #include "data/text.h"
@@ -94,7 +96,8 @@ void frmResults::CloseSheet() {
 }
 
 /// The last result of the player in hand for this team, opposition and date, which is then in the
-/// record buffer; 0 for none.
+/// record buffer; 0 for none, with the first record of the file there, where a search from the back
+/// ends.
 int frmResults::FindSavedResult() {
   const Session& session = context_.session;
   const ResultKey wanted{static_cast<std::int32_t>(Val(panPlrID.Caption())), session.Team,
@@ -105,7 +108,7 @@ int frmResults::FindSavedResult() {
     if (wanted.Fits(result)) found = number;
     return true;
   });
-  if (found > 0) ReadRecord(found);
+  if (session.ResultCount > 0) ReadRecord(std::max(found, 1));
   context_.channels.CloseAll();
   return found;
 }
@@ -164,12 +167,13 @@ void frmResults::EnableBoxes() {
 void frmResults::DisableBoxes() { scores.Disable(); }
 
 void frmResults::chkFF_Click() {
-  if (!chkFF.Value()) {
-    scores.Enable();
-    return;
-  }
+  // Either way: a night that was played after all has none of the figures of a saved forfeit.
   scores.Blank();
-  DisableBoxes();
+  if (chkFF.Value()) {
+    DisableBoxes();
+  } else {
+    scores.Enable();
+  }
 }
 
 void frmResults::cmdClearRes_Click() {

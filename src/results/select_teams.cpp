@@ -28,6 +28,18 @@ void frmResults::Start() {
   if (cboResGrade.Count() > 0) cboResGrade.SetIndex(0);
 }
 
+/// Back from the setup, which may have added and removed grades: what was picked stands as it was,
+/// unless another competition has been opened since `competition` was left.
+void frmResults::StartAgain(const std::string& competition) {
+  const std::string grade = cboResGrade.Text();
+  const Date day = Cal.Value();
+  Start();
+  if (context_.session.PlayerFile != competition) return;
+  Cal.SetValue(day);
+  txtDayName.SetText(DayName(day));
+  if (const int line = cboResGrade.Find(grade); line >= 0) cboResGrade.SetIndex(line);
+}
+
 /// The work date, both date pickers and the name of the day become those of a date.
 void frmResults::ShowDay(Date date) {
   // A date that no calendar holds fails here, before anything has moved.
@@ -92,7 +104,7 @@ void frmResults::OfferMoreTeams() {
                        "Do you wish to add more teams now ?"}));
   if (answer == kAnswerNo || !InScreens().Knows("frmNames")) return;
   context_.session.Flag = 1;
-  away_in_setup_ = true;
+  away_from_ = context_.session.PlayerFile;
   InScreens().Hide(*this);
   InScreens().Show("frmNames");
 }

@@ -60,5 +60,10 @@ TEST_F(DriveOptionsRead, EndAtOnceWithTwoWithoutAFolder) {
   EXPECT_EQ(exit_status, 2);
 }
 
+TEST_F(DriveOptionsRead, EndAtOnceWithTwoForAFolderWithoutAName) {
+  EXPECT_FALSE(Read({""}));
+  EXPECT_EQ(exit_status, 2);
+}
+
 }  // namespace
 }  // namespace marlowbeck

@@ -221,6 +221,19 @@ TEST_F(CorrectSheet, AForfeitUntickedMeetsAllChecks) {
   EXPECT_EQ(Saved()[0].Aggregate, 1000);
 }
 
+TEST_F(CorrectSheet, AForfeitUntickedLeavesTheBoxesBlank) {
+  ResultRecord forfeit = Forfeit();
+  forfeit.HighScore = 60;
+  forfeit.Pegs = {0, 0, 0, 0, 40, 0};
+  Open({forfeit});
+  Do("click chkFF");
+  for (const char* box : {"txtAgg", "txtShots", "txtAvg", "txtHS", "txtCent", "txtHowMany180s",
+                          "txtP1", "txtP2", "txtP3", "txtP4", "txtP5", "txtP6", "txtLegs"}) {
+    EXPECT_EQ(Text(box), "") << box;
+    EXPECT_TRUE(Enabled(box)) << box;
+  }
+}
+
 TEST_F(CorrectSheet, ANightCanBecomeAForfeit) {
   Open({Full()});
   DoAll({"click chkFF", "click cmdSave"});
@@ -244,6 +257,23 @@ TEST_F(CorrectSheet, TheSecondOfTwoPlayersOfOneNameCannotBeReached) {
   EXPECT_EQ(Caption("panPlrID"), "7");
   EXPECT_EQ(InSession("EditRecord"), 0);
   EXPECT_EQ(Text("txtAgg"), "");
+}
+
+TEST_F(CorrectSheet, ASheetWhoseRecordIsNotFoundTakesTheGradeOfTheFirstOneAlong) {
+  WritePlayers(kLeagueFile, {Player(7, "Hill", "Al", "Hawks", "A Grade"),
+                             Player(8, "Hill", "Al", "Hawks", "A Grade"),
+                             Player(1, "Reed", "Jo", "Lions", "A Grade")});
+  ResultRecord first = Night(8, "Hawks", "Lions");
+  first.Grade = "First";
+  ResultRecord last = Night(1, "Lions", "Hawks");
+  last.Grade = "Last";
+  // The search for a record of player 7 goes from the last one back to the first.
+  Open({first, last});
+  TypeInto(GoodSheet());
+  Do("click cmdSave");
+  ASSERT_EQ(Saved().size(), 3U);
+  EXPECT_EQ(Saved()[2].ID, 7);
+  EXPECT_EQ(Trim(Saved()[2].Grade), "First");
 }
 
 TEST_F(CorrectSheet, NegativeFiguresAreLeftOutOfTheBoxes) {

@@ -126,6 +126,67 @@ TEST_F(GradeAndDate, AFlagOfAnotherScreenIsNoFailedCheck) {
   EXPECT_EQ(InSession("Flag"), 0);
 }
 
+class AwayInSetup : public GradeAndDate {
+ protected:
+  void GoThere() {
+    DoAll({"click imgSheets", "date Cal 2004-04-08", "pick cboResGrade =C Grade", "answer yes",
+           "click cmdGotoResults"});
+    ASSERT_EQ(Front(), "frmNames");
+  }
+  void AddSecondTeam() {
+    DoAll({"pick cboAddGrd =C Grade", "type cboAddTm Bears", "type txtAddSn Oak",
+           "type txtAddFn Ida", "click cmdAddSave"});
+  }
+};
+
+TEST_F(AwayInSetup, TheGradeAndDatePickedStandAsTheyWere) {
+  GoThere();
+  Do("click cmdAddCancel");
+  EXPECT_EQ(Front(), "frmResults");
+  EXPECT_EQ(Text("cboResGrade"), "C Grade");
+  EXPECT_EQ(DateOf("Cal"), "2004-04-08");
+  EXPECT_EQ(Text("txtDayName"), "Thursday");
+  EXPECT_EQ(Focus(), "frmResults.cmdGotoResults");
+}
+
+TEST_F(AwayInSetup, TheGradeLeadsOnOnceItHasASecondTeam) {
+  GoThere();
+  AddSecondTeam();
+  DoAll({"click cmdAddCancel", "click imgSheets", "click cmdGotoResults"});
+  EXPECT_TRUE(BoxTexts().empty());
+  EXPECT_EQ(Caption("lblHeader(0)"), "C Grade");
+  EXPECT_EQ(Lines("cboResTeam"), (TextList{"Alone", "Bears"}));
+  EXPECT_EQ(InSession("WorkDate"), "2004-04-08");
+}
+
+TEST_F(AwayInSetup, AGradeAddedMeanwhileIsListed) {
+  GoThere();
+  DoAll({"input D Grade", "click cmdNewGrd", "focus cboAddGrd", "key Tab", "click chkNun",
+         "click cmdNoPOK", "type cboAddTm Deers", "type txtAddSn Elm", "type txtAddFn Uma",
+         "click cmdAddSave", "click cmdAddCancel", "click imgSheets"});
+  EXPECT_EQ(Lines("cboResGrade"), (TextList{"A Grade", "B Grade", "C Grade", "D Grade"}));
+  EXPECT_EQ(Text("cboResGrade"), "C Grade");
+}
+
+TEST_F(AwayInSetup, AGradeThatHasGoneGivesWayToTheFirst) {
+  GoThere();
+  DoAll({"pick cboAddGrd =C Grade", "pick cboAddTm =Alone", "pick lstPlayers 0", "answer ok",
+         "click cmdDelName", "click cmdAddCancel", "click imgSheets"});
+  EXPECT_EQ(Text("cboResGrade"), "A Grade");
+  EXPECT_EQ(DateOf("Cal"), "2004-04-08");
+}
+
+TEST_F(AwayInSetup, AnotherCompetitionStartsAfresh) {
+  WritePlayers("Other.qza", {Player(1, "Reed", "Jo", "Rovers", "B Grade"),
+                             Player(2, "Hill", "Al", "Hawks", "B Grade"),
+                             Player(3, "Vale", "Su", "Hawks", "C Grade")});
+  GoThere();
+  DoAll({"close frmNames", "file Other.qza", "click mnuOpen", "click imgSheets"});
+  EXPECT_EQ(Lines("cboResGrade"), (TextList{"B Grade", "C Grade"}));
+  EXPECT_EQ(Text("cboResGrade"), "B Grade");
+  EXPECT_EQ(DateOf("Cal"), "2004-03-31");
+}
+
 TEST_F(GradeAndDate, CancelAtFirstGoesBackToTheMainMenu) {
   DoAll({"click imgSheets", "click cmdExit"});
   EXPECT_EQ(Front(), "frmDB");

@@ -48,6 +48,10 @@ class MemoryFileSystem : public FileSystem {
     files_[UpperCase(to)] = files_[UpperCase(from)];
     if (UpperCase(from) != UpperCase(to)) files_.erase(UpperCase(from));
   }
+  void ReplaceUnsynced(const std::string& from, const std::string& to) override {
+    Replace(from, to);
+  }
+  void SyncFolder(const std::string&) override {}
   void Copy(const std::string& from, const std::string& to) override {
     Require(from);
     Bytes(to) = Bytes(from);

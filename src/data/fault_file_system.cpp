@@ -146,6 +146,16 @@ void FaultFileSystem::Replace(const std::string& from, const std::string& to) {
   real_.Replace(from, to);
 }
 
+void FaultFileSystem::ReplaceUnsynced(const std::string& from, const std::string& to) {
+  plan_.Begin(FileOperation::Rename);
+  real_.ReplaceUnsynced(from, to);
+}
+
+void FaultFileSystem::SyncFolder(const std::string& folder) {
+  plan_.Begin(FileOperation::Sync);
+  real_.SyncFolder(folder);
+}
+
 void FaultFileSystem::Copy(const std::string& from, const std::string& to) {
   const auto cut = plan_.Begin(FileOperation::Copy);
   if (!cut) return real_.Copy(from, to);

@@ -84,6 +84,8 @@ class FaultFileSystem : public FileSystem {
   void Discard(const std::string& path) override;
   void Rename(const std::string& from, const std::string& to) override;
   void Replace(const std::string& from, const std::string& to) override;
+  void ReplaceUnsynced(const std::string& from, const std::string& to) override;
+  void SyncFolder(const std::string& folder) override;
   void Copy(const std::string& from, const std::string& to) override;
   void MakeFolder(const std::string& path) override;
   void RemoveFolder(const std::string& path) override;

@@ -55,6 +55,11 @@ class FileSystem {
   /// Puts `from` in the place of `to`, whether or not that exists, in one step, and returns once
   /// the folder has reached the disk. Both must lie on one volume.
   virtual void Replace(const std::string& from, const std::string& to) = 0;
+  /// The same, but that the folder may reach the disk later, as SyncFolder has it. After a power
+  /// cut before that either file is there. For runs over many files.
+  virtual void ReplaceUnsynced(const std::string& from, const std::string& to) = 0;
+  /// Returns once the names in a folder have reached the disk.
+  virtual void SyncFolder(const std::string& folder) = 0;
   /// All of a file, with the time of its last change. Returns once the bytes have reached the disk.
   virtual void Copy(const std::string& from, const std::string& to) = 0;
   virtual void MakeFolder(const std::string& path) = 0;

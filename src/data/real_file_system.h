@@ -19,6 +19,8 @@ class RealFileSystem : public FileSystem {
   void Discard(const std::string& path) override;
   void Rename(const std::string& from, const std::string& to) override;
   void Replace(const std::string& from, const std::string& to) override;
+  void ReplaceUnsynced(const std::string& from, const std::string& to) override;
+  void SyncFolder(const std::string& folder) override;
   void Copy(const std::string& from, const std::string& to) override;
   void MakeFolder(const std::string& path) override;
   void RemoveFolder(const std::string& path) override;
@@ -35,6 +37,9 @@ class RealFileSystem : public FileSystem {
   [[nodiscard]] std::filesystem::path Located(const std::string& path) const;
   /// The same for a folder, which has to be there.
   [[nodiscard]] std::filesystem::path LocatedFolder(const std::string& folder) const;
+
+  /// Answers what it has replaced.
+  std::filesystem::path PutInPlace(const std::string& from, const std::string& to);
 
   std::filesystem::path current_;
 };

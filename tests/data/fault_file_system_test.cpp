@@ -119,6 +119,18 @@ TEST_F(Faults, ACopyCountsAsAWriteThatCanBeCut) {
   EXPECT_EQ(folder.Read("b"), "abcdef");
 }
 
+TEST_F(Faults, ARunsReplacementsAndItsSyncAreCountedAndFail) {
+  Write("a", "new");
+  Write("b", "old");
+  Plan().FailAt(FileOperation::Rename, 1, 57, false);
+  Plan().FailAt(FileOperation::Sync, 1, 61, false);
+  EXPECT_ERROR(57, files.ReplaceUnsynced("a", "b"));
+  EXPECT_ERROR(61, files.SyncFolder("."));
+  files.ReplaceUnsynced("a", "b");
+  EXPECT_EQ(folder.Read("b"), "new");
+  EXPECT_EQ(Plan().Done(FileOperation::Rename), 2);
+}
+
 TEST_F(Faults, AWorkFileThatCannotBeDiscardedStays) {
   Write("a.txt", "x");
   Plan().FailAt(FileOperation::Delete, 1, 75, false);

@@ -171,6 +171,17 @@ TEST_F(RealFiles, ReplacesAFileThatIsThereAndOneThatIsNot) {
   EXPECT_EQ(files.List(folder.Path()).size(), 1U);
 }
 
+TEST_F(RealFiles, ReplacesWithoutWaitingForTheFolderToo) {
+  Write("a.txt", "new");
+  Write("b.txt", "old");
+  files.ReplaceUnsynced("a.txt", "B.TXT");
+  EXPECT_EQ(Read("b.txt"), "new");
+  EXPECT_FALSE(files.Exists("a.txt"));
+  EXPECT_ERROR(53, files.ReplaceUnsynced("a.txt", "b.txt"));
+  files.SyncFolder(folder.Path());
+  EXPECT_ERROR(76, files.SyncFolder(folder.In("none")));
+}
+
 TEST_F(RealFiles, ReplacingKeepsThePermissionsOfTheFile) {
   Write("file", "old");
   fs::permissions(folder.In("file"), fs::perms(0640));
@@ -269,6 +280,24 @@ TEST_F(RealFiles, ACopyHasTheTimeOfTheLastChange) {
   files.Copy("a.txt", "b.txt");
   EXPECT_EQ(fs::last_write_time(folder.In("b.txt")), changed);
   EXPECT_EQ(Read("b.txt"), "new");
+}
+
+TEST_F(RealFiles, ACopyHasTheProtectionOfItsSource) {
+  Write("a.txt", "text");
+  fs::permissions(folder.In("a.txt"), fs::perms::owner_read);
+  files.Copy("a.txt", "b.txt");
+  EXPECT_EQ(fs::status(folder.In("b.txt")).permissions(), fs::perms::owner_read);
+}
+
+TEST_F(RealFiles, CopiesFilesOfAnyLength) {
+  for (const std::size_t length : {std::size_t{0}, std::size_t{1}, std::size_t{256} * 1024,
+                                   std::size_t{256} * 1024 + 1, std::size_t{3000000}}) {
+    std::string text(length, 'x');
+    for (std::size_t i = 0; i < length; i += 251) text[i] = static_cast<char>('a' + i % 26);
+    Write("a.txt", text);
+    files.Copy("a.txt", "b.txt");
+    EXPECT_TRUE(Read("b.txt") == text) << length;
+  }
 }
 
 TEST_F(RealFiles, TellsTheLengthOfAFileThatIsThere) {

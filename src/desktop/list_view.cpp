@@ -1,5 +1,8 @@
 #include "desktop/list_view.h"
 
+#include <algorithm>
+#include <iterator>
+
 #include <QScrollBar>
 #include <QTimer>
 
@@ -7,6 +10,24 @@
 #include "ui/disk_lists.h"
 
 namespace marlowbeck {
+namespace {
+
+/// How many lines at each end of a list stay as they are shown.
+struct Kept {
+  int above = 0;
+  int below = 0;
+};
+
+/// A long list that grows line by line is not made anew for each.
+Kept KeptOf(const std::vector<std::string>& shown, const std::vector<std::string>& lines) {
+  const auto above = std::mismatch(shown.begin(), shown.end(), lines.begin(), lines.end());
+  const auto below = std::mismatch(shown.rbegin(), std::reverse_iterator(above.first),
+                                   lines.rbegin(), std::reverse_iterator(above.second));
+  return {static_cast<int>(above.first - shown.begin()),
+          static_cast<int>(below.first - shown.rbegin())};
+}
+
+}  // namespace
 
 ListView::ListView(ListBox& control, QListWidget* list, Windows& windows)
     : CaptionedView(control, list, windows), model_(control), list_(*list) {
@@ -40,16 +61,20 @@ void ListView::ShowKind() {
 }
 
 void ListView::ShowLines() {
-  if (shown_lines_ == model_.Lines()) return;
-  shown_lines_ = model_.Lines();
+  const std::vector<std::string>& lines = model_.Lines();
+  if (shown_lines_ == lines) return;
   const int scrolled = list_.verticalScrollBar()->value();
-  list_.clear();
+  const Kept kept = KeptOf(shown_lines_, lines);
+  if (kept.above + kept.below == 0) list_.clear();
+  for (int i = list_.count() - kept.below; i > kept.above; --i) delete list_.takeItem(i - 1);
   // Told that there is no current line, the list makes none of its own when the focus comes.
   list_.setCurrentIndex({});
   QStringList texts;
-  for (const std::string& line : shown_lines_) texts.append(ToQt(line));
-  list_.addItems(texts);
+  std::for_each(lines.begin() + kept.above, lines.end() - kept.below,
+                [&](const std::string& line) { texts.append(ToQt(line)); });
+  list_.insertItems(kept.above, texts);
   list_.verticalScrollBar()->setValue(scrolled);
+  shown_lines_ = lines;
   shown_line_ = -1;
 }
 

@@ -174,8 +174,12 @@ Outcome Hand::Pick(Control& control, int line) {
   if (list == nullptr) return Refused(control, "has no lines");
   if (IsHeld(control)) return Refused(control, "is locked");
   if (line < 0 || line >= list->Count()) return Refused(control, "has no such line");
+  // The focus may bring the list up to date: what is picked is the line that was seen.
+  const std::string seen = list->Line(line);
   return Act(control, [=] {
-    if (line < list->Count()) PickLine(*list, line);
+    const bool stands = line < list->Count() && list->Line(line) == seen;
+    const int place = stands ? line : list->Find(seen);
+    if (place >= 0) PickLine(*list, place);
     list->Fire(list->MouseUp);
   });
 }

@@ -28,6 +28,20 @@ TEST_F(HandTest, AClickMovesTheFocusFirstThenClicks) {
   EXPECT_EQ(Happened(), Log{"click cmdA"});
 }
 
+TEST_F(HandTest, APickIsOfTheLineThatWasSeenWhereTheFocusBringsTheListUpToDate) {
+  FillList();
+  a.lstA.GotFocus = [this] {
+    a.lstA.Clear();
+    for (const char* line : {"new", "one", "two"}) a.lstA.AddLine(line);
+  };
+  hand.Pick(a.lstA, 1);
+  EXPECT_EQ(a.lstA.Line(a.lstA.Index()), "two");
+  hand.Focus(a.txtA);
+  a.lstA.GotFocus = [this] { a.lstA.Clear(); };
+  EXPECT_TRUE(hand.Pick(a.lstA, 1).Done());
+  EXPECT_EQ(a.lstA.Index(), -1) << "the line has gone";
+}
+
 TEST_F(HandTest, AClickIsLostWhenLeavingShowsABox) {
   a.txtA.LostFocus = [this] { Box("too high"); };
   const Outcome outcome = hand.Click(a.cmdA);

@@ -2,6 +2,7 @@
 
 #include <memory>
 
+#include "filecopy/frmBackup.h"
 #include "fixtures/frmFixtures.h"
 #include "ladder/frmLadder.h"
 #include "results/frmChangeDate.h"
@@ -49,6 +50,7 @@ void RegisterScreens(Screens& screens, const Context& context) {
   Register<frmPlayersLists>(screens, "frmPlayersLists", context);
   Register<frmSearchPlayer>(screens, "frmSearchPlayer", context);
   Register<frmFixtures>(screens, "frmFixtures", context);
+  Register<frmBackup>(screens, "frmBackup", context);
   Register<frmErrors>(screens, "frmErrors", context);
 }
 

@@ -393,7 +393,7 @@ TEST_F(MainMenu, TeamsDifferByCaseOfTheirLetters) {
 
 TEST_F(MainMenu, CommandsOfScreensThatAreNotThereOpenNothing) {
   OpenTwoTeams();
-  for (const char* command : {"click imgKO", "click imgbackup"}) {
+  for (const char* command : {"click imgKO"}) {
     Do(command);
     EXPECT_TRUE(Boxes().empty()) << command;
     EXPECT_EQ(Front(), "frmDB") << command;

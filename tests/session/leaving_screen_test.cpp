@@ -74,9 +74,11 @@ TEST_F(LeavingTheProgram, EscOnTheReminderEndsTheProgram) {
   EXPECT_EQ(Count("ended"), 1);
 }
 
-TEST_F(LeavingTheProgram, BackupOpensNothingUntilThereIsACopier) {
+TEST_F(LeavingTheProgram, FirstOptionLeadsToTheCopier) {
   DoAll({"click imgExit", "click cmdAddSave0"});
-  EXPECT_EQ(Front(), "frmBuend");
+  EXPECT_EQ(Front(), "frmBackup");
+  EXPECT_FALSE(Loaded("frmBuend"));
+  EXPECT_EQ(Caption("cmdCancel"), "End Marlowbeck");
   EXPECT_EQ(Count("ended"), 0);
 }
 

@@ -113,6 +113,7 @@ void CompareWithPlainLoops(const std::vector<LadderRecord>& matches, const Ladde
                            Date up_to) {
   const std::vector<std::string> teams = SomeTeams(matches);
   std::vector<PlainTeam> plain;
+  plain.reserve(teams.size());
   for (const std::string& team : teams) plain.emplace_back(team, rules);
   for (const LadderRecord& match : matches) {
     for (PlainTeam& team : plain) {

@@ -136,6 +136,24 @@ TEST_F(LadderPenalties, ATeamTwiceOnADateHoldsItsPointsInItsFirstMatch) {
   EXPECT_EQ(Matches()[1].HomePenalty, 0);
 }
 
+TEST_F(LadderPenalties, OfATeamTwiceOnADateThePointsOfItsFirstMatchComeUp) {
+  LayGrade(
+      *this, OnePlayerEach(kFourTeams),
+      {MatchOn(17, "Bravo", 6, "Alpha", 5), Adjusted(MatchOn(17, "Alpha", 6, "Charlie", 5), 4, 0)});
+  OpenFor("Alpha");
+  EXPECT_EQ(Text("txtPenPts"), "");
+  EXPECT_EQ(Caption("lblPen1"), kWords);
+}
+
+TEST_F(LadderPenalties, ABlankTeamHasNoPartInABye) {
+  LayGrade(*this, OnePlayerEach({"", "Alpha"}), {Adjusted(MatchOn(17, "Alpha", 0, "", 0), 0, 3)});
+  OpenLadder();
+  DoAll({"click cmdPenalty", "pick lstPenalty 0"});
+  EXPECT_EQ(Text("txtPenPts"), "");
+  DoAll({"type txtPenPts 2", "click cmdPenOK"});
+  EXPECT_TRUE(OnFile({Adjusted(MatchOn(17, "Alpha", 0, "", 0), 0, 3)}));
+}
+
 TEST_F(LadderPenalties, OnlyTheMatchOfTheShownDateIsLookedAt) {
   OpenLadder();
   DoAll({"pick lstTableDates =03/03/2004", "click cmdPenalty", "pick lstPenalty =Bravo"});

@@ -351,6 +351,15 @@ TEST_F(LadderPrinting, ClipboardHoldsResultsAndLadderAsTabbedText) {
   EXPECT_EQ(Boxes().at(0).style, 64);
 }
 
+TEST_F(LadderPrinting, TheSeasonsTitleIsReadForTheClipboard) {
+  Lay();
+  OpenTab();
+  WriteFile("Winter_A Grade.qzs", "\" Summer 2005 \"\r\n");
+  Do("click cmdClipLadder");
+  const std::string text = EventsNamed("clipboard").at(1);
+  EXPECT_TRUE(text.starts_with("Marlow Darts\r\nSummer 2005\r\nA Grade    Wednesday"));
+}
+
 TEST_F(LadderPrinting, LeavingDoesNotClearTheClipboard) {
   Lay();
   OpenTab();

@@ -76,6 +76,19 @@ TEST_F(LadderTable, AGradeWithoutMatchesShowsNoTable) {
   EXPECT_TRUE(Shown("fraHelpExit"));
 }
 
+TEST_F(LadderTable, AnotherGradeWithoutMatchesTakesTheTableAway) {
+  std::vector<PlayerRecord> players = OnePlayerEach(kFourTeams);
+  players.push_back(Player(9, "Archer", "Al", "Xerxes", "B"));
+  WritePlayers("Winter.qza", players);
+  WriteFile("Winter_B.qzs", "\"Winter B\"\r\n");
+  OpenLadder();
+  EXPECT_TRUE(Shown("fraCmds"));
+  Do("pick cboTGrades =B");
+  EXPECT_TRUE(Lines("lstTableDates").empty());
+  for (const char* hidden : {"fraCmds", "grdLad", "grdWk", "lblLadHeader", "lblGameDetails"})
+    EXPECT_FALSE(Shown(hidden)) << hidden;
+}
+
 TEST_F(LadderTable, ATeamThatHasNotPlayedStandsAtTheEndWithZeros) {
   LayGrade(*this, OnePlayerEach({"Alpha", "Bravo", "Idle"}), {MatchOn(3, "Bravo", 6, "Alpha", 0)});
   OpenLadder();
@@ -167,6 +180,16 @@ TEST_F(LadderBadFiles, DatesOutOfOrderAreListedAsTheyStandUntilTheFileIsSorted) 
   DoAll({"click cmdSC", "click cmdPL"});
   EXPECT_EQ(Lines("lstTableDates"), (TextList{"03/03/2004", "10/03/2004", "17/03/2004"}));
   EXPECT_EQ(Row("grdLad", 1)[0], "Alpha");
+}
+
+TEST_F(LadderBadFiles, MatchesWithATimeOfDayAreNoneOfTheirDay) {
+  LadderRecord match = MatchOn(17, "Alpha", 6, "Bravo", 5);
+  match.GameDate.days += 0.75;
+  WriteFile(kLadderOfA, FileOf(std::vector{match}));
+  OpenLadder();
+  EXPECT_EQ(Lines("lstTableDates"), TextList{"17/03/2004"});
+  EXPECT_FALSE(Shown("grdWk")) << "no frame round nothing";
+  EXPECT_EQ(Row("grdLad", 1)[1], "0");
 }
 
 TEST_F(LadderBadFiles, ADateOfNoCalendarEndsInTheErrorBox) {

@@ -34,10 +34,10 @@ std::vector<std::string> TextsOf(const std::string& content) {
 
 /// What a quoted text cannot carry: a line end, or a quote that looks like its last one.
 bool CanBeQuoted(const std::string& text) {
-  if (text.find_first_of("\r\n") != text.npos) return false;
-  for (auto quote = text.find('"'); quote != text.npos; quote = text.find('"', quote + 1)) {
+  if (text.find_first_of("\r\n") != std::string::npos) return false;
+  for (auto quote = text.find('"'); quote != std::string::npos; quote = text.find('"', quote + 1)) {
     const auto next = text.find_first_not_of(" \t", quote + 1);
-    if (next != text.npos && (text[next] == ',' || text[next] == '"')) return false;
+    if (next != std::string::npos && (text[next] == ',' || text[next] == '"')) return false;
   }
   return true;
 }
@@ -125,7 +125,7 @@ void Words(Input input) {
   Must(!std::isnan(Val(text)), "a reading is a number");
   double number = 0;
   if (Try([&] { number = NumberOf(text); })) {
-    Must(number == Val(Trim(text)) || text.find('\t') != text.npos, "whole and prefix agree");
+    Must(number == Val(Trim(text)) || text.find('\t') != std::string::npos, "whole and prefix agree");
     if (std::isfinite(number)) {
       Must(std::abs(Val(NumberText(number)) - number) <= std::abs(number) * 1e-14, "written back");
     }

@@ -125,7 +125,8 @@ void Words(Input input) {
   Must(!std::isnan(Val(text)), "a reading is a number");
   double number = 0;
   if (Try([&] { number = NumberOf(text); })) {
-    Must(number == Val(Trim(text)) || text.find('\t') != std::string::npos, "whole and prefix agree");
+    Must(number == Val(Trim(text)) || text.find('\t') != std::string::npos,
+         "whole and prefix agree");
     if (std::isfinite(number)) {
       Must(std::abs(Val(NumberText(number)) - number) <= std::abs(number) * 1e-14, "written back");
     }

@@ -244,6 +244,32 @@ TEST_F(Report, OneRowMoreIsRefused) {
   EXPECT_TRUE(Events().at(0).contains("killed"));
 }
 
+TEST_F(Report, HeadingRowThatDoesNotFitIsRefusedThoughThereAreNoOthers) {
+  tables_ = {LongTable(0)};
+  const int bottom = static_cast<int>(567 + 3 * (kLine + kHalf) + kPitch);
+  Do("printer height " + std::to_string(bottom + 400 + static_cast<int>(kPitch)));
+  EXPECT_EQ(OnePage().boxes.size(), 1U);
+  Do("printer height " + std::to_string(bottom + 400 + static_cast<int>(kPitch) - 1));
+  Print();
+  ExpectThrownAway(kTooLong);
+}
+
+TEST_F(Report, ATableThatIsTooWideIsToldBeforeTheDocumentIsThrownAway) {
+  tables_ = {WideTable(100, "8888")};
+  Print();
+  EXPECT_TRUE(Events().at(0).contains("box"));
+  EXPECT_TRUE(Events().at(1).contains("killed"));
+}
+
+TEST_F(Report, ABlankPreparesThePrinterAtTheTopOfEachPage) {
+  options_.copies = 2;
+  Print();
+  for (const Json& page : EventsNamed("printed").at(0)["pages"]) {
+    EXPECT_EQ(page[0]["text"], " ");
+    EXPECT_EQ(page[0]["y"], 0);
+  }
+}
+
 TEST_F(Report, AllCopiesAreOneDocumentOfEqualPages) {
   options_.copies = 3;
   Print();

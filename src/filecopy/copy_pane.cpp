@@ -43,15 +43,19 @@ void CopyPane::ClearSelection() {
 
 void CopyPane::ShowCount() { txtNumFile.SetText(CountWords(BuFile.Count())); }
 
-void CopyPane::Refresh() {
+void CopyPane::RefreshFolders() {
   try {
     BuDir.Refresh();
-    BuFile.Refresh();
   } catch (const RunTimeError&) {
     const std::string nearest = NearestFolder(files_, Path());
     if (nearest == Path()) throw;
     BuDir.SetPath(nearest);
   }
+}
+
+void CopyPane::Refresh() {
+  RefreshFolders();
+  BuFile.Refresh();
 }
 
 }  // namespace marlowbeck

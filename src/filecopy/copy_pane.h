@@ -35,7 +35,9 @@ struct CopyPane {
   /// No file is selected any more; the count is back.
   void ClearSelection();
   void ShowCount();
-  /// Reads the disk anew. A folder that has gone gives way to the nearest one above it.
+  /// Reads the disk anew: the folders alone, or the files too. A folder that has gone gives way to
+  /// the nearest one above it.
+  void RefreshFolders();
   void Refresh();
 
  private:

@@ -66,7 +66,7 @@ struct frmBackup : Screen {
   void DeleteFiles(CopyPane& pane);
   void EndDeleting(CopyPane& pane);
   void DeleteFolder(CopyPane& pane);
-  void NewFolder(CopyPane& pane);
+  void NewFolder(CopyPane& pane, CopyPane& other);
 
   /// Does work on files that advances the bar. A failure leaves no bar and no selection behind.
   void WithBar(CopyPane& pane, int files, const std::function<void()>& work);

@@ -73,7 +73,7 @@ void frmBackup::CopySelected(CopyPane& from, CopyPane& to) {
 
 /// False when the run was ended by the user.
 bool frmBackup::CopyEach(CopyPane& from, CopyPane& to, int& copied) {
-  const std::string source = from.Path();
+  const std::string& source = from.Path();
   const std::string target = to.Path();
   const TargetNames targets(to.BuFile);
   context_.channels.Files().ChangeFolder(source);

@@ -56,13 +56,14 @@ void frmBackup::DeleteFolder(CopyPane& pane) {
   EndDeleting(pane);
 }
 
-void frmBackup::NewFolder(CopyPane& pane) {
+/// What is selected in the other pane stays so.
+void frmBackup::NewFolder(CopyPane& pane, CopyPane& other) {
   const std::string name = Trim(context_.platform.boxes.Input(
       {NewFolderPrompt(pane.Path()), "Marlowbeck", "New Folder", {}}));
   if (name.empty()) return;
   context_.channels.Files().MakeFolder(PathIn(pane.Path(), name));
-  S.Refresh();
-  D.Refresh();
+  pane.Refresh();
+  other.RefreshFolders();
 }
 
 }  // namespace marlowbeck

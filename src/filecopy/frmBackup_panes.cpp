@@ -32,7 +32,7 @@ void frmBackup::Connect(CopyPane& pane, CopyPane& other) {
   pane.cmdBu.Click = [this, &pane, &other] { CopyClicked(pane, other); };
   pane.cmdDelete.Click = [this, &pane] { DeleteFiles(pane); };
   pane.cmdDelFolder.Click = [this, &pane] { DeleteFolder(pane); };
-  pane.cmdNew.Click = [this, &pane] { NewFolder(pane); };
+  pane.cmdNew.Click = [this, &pane, &other] { NewFolder(pane, other); };
 }
 
 /// On the program's folder. Nothing is told of it: the pane is not yet connected.

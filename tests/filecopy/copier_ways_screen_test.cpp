@@ -57,6 +57,12 @@ TEST_F(CopierWays, TheWindowEndsTheProgramOnTheWayOutToo) {
   EXPECT_EQ(Count("ended"), 1);
 }
 
+TEST_F(CopierWays, EscEndsTheProgramOnTheWayOutToo) {
+  LeaveByTheReminder();
+  Do("key Esc");
+  EXPECT_EQ(Count("ended"), 1);
+}
+
 TEST_F(CopierWays, FromTheReminderBackToTheMainMenuWithAllItsPictures) {
   Do("key Esc");
   DoAll({"click cmdAddSave0", "click cmdMain"});

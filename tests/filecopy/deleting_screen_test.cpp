@@ -168,6 +168,15 @@ TEST_F(CopierFolders, ThatAreNewAreSeenInBothPanes) {
   EXPECT_EQ(Lines("BuDirD"), (TextList{"..", "New Folder", "Stick"}));
 }
 
+TEST_F(CopierFolders, ThatAreNewLeaveTheOtherPanesSelection) {
+  Open();
+  DoAll({"select BuFileD 0 1", "input Week 7", "click cmdNewS"});
+  EXPECT_EQ(Marked("BuFileD"), (std::vector<int>{0, 1}));
+  EXPECT_EQ(Text("txtNumFileD"), "2  Files selected.");
+  EXPECT_EQ(Buttons('D'), "AUC-D-");
+  EXPECT_EQ(Lines("BuDirD"), (TextList{"..", "Stick", "Week 7"}));
+}
+
 TEST_F(CopierFolders, WithoutANameAreNotMade) {
   Open();
   for (const char* answer : {"input", "input-cancel", "input    "}) {

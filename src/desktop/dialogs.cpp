@@ -24,9 +24,9 @@ void DressFileDialog(QFileDialog& dialog, const FileDialogRequest& request) {
   dialog.setDefaultSuffix(ToQt(request.extension));
   dialog.setAcceptMode(open ? QFileDialog::AcceptOpen : QFileDialog::AcceptSave);
   dialog.setFileMode(open ? QFileDialog::ExistingFile : QFileDialog::AnyFile);
-  // The program asks in its own words about a file that is there already.
-  dialog.setOptions(QFileDialog::DontUseNativeDialog | QFileDialog::DontConfirmOverwrite |
-                    QFileDialog::HideNameFilterDetails);
+  dialog.setOptions(QFileDialog::DontUseNativeDialog | QFileDialog::HideNameFilterDetails);
+  // Elsewhere the program asks in its own words.
+  dialog.setOption(QFileDialog::DontConfirmOverwrite, !request.asks_before_overwriting);
   if (!request.name.empty() && !IsPattern(request.name)) dialog.selectFile(ToQt(request.name));
 }
 

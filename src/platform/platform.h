@@ -74,6 +74,7 @@ struct FileDialogRequest {
   std::string folder;
   std::string name;  ///< what stands in the name box to begin with
   std::string extension;
+  bool asks_before_overwriting = false;  ///< a file that is there already
 };
 
 struct FontChoice {

@@ -6,7 +6,6 @@
 #include "data/runtime_error.h"
 #include "data/text.h"
 #include "print/font_settings.h"
-#include "session/messages.h"
 
 namespace marlowbeck {
 namespace {
@@ -26,8 +25,8 @@ void FontLabel::SetFont(const PrinterFont& font) {
   Touch();
 }
 
-FontBox::FontBox(const Context& context, const Controls& controls)
-    : context_(context), controls_(controls) {
+FontBox::FontBox(const Context& context, const Controls& controls, Beep beep)
+    : context_(context), controls_(controls), beep_(beep) {
   controls_.lblFontInfo.Hide();
   controls_.lblFont.Click = [this] { Choose(); };
   controls_.lblFont.MouseMove = [this] { controls_.lblFontInfo.Show(); };
@@ -74,7 +73,8 @@ void FontBox::Take(const FontChoice& chosen) {
           Lines({"The font size you selected is to large. Please select    ",
                  "fonts 24 points or less. If you select a font size too    ",
                  "large for printing, the print job will automatically be    ",
-                 "cancelled and a message will advise you to alter the    ", "font size.   "}));
+                 "cancelled and a message will advise you to alter the    ", "font size.   "}),
+          beep_);
   session.PrintFontSize = old_size;
 }
 

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "platform/platform.h"
+#include "session/messages.h"
 #include "ui/context.h"
 #include "ui/controls.h"
 
@@ -29,8 +30,8 @@ class FontBox {
     Label& lblFontInfo;  ///< the hint, seen while the pointer is over `lblFont`
   };
 
-  /// Wires the controls and hides the hint.
-  FontBox(const Context& context, const Controls& controls);
+  /// Wires the controls and hides the hint. `beep` is that of its warning.
+  FontBox(const Context& context, const Controls& controls, Beep beep = Beep::No);
 
   /// Reads the printer font from its file and shows it.
   void GetFont();
@@ -43,6 +44,7 @@ class FontBox {
 
   const Context& context_;
   Controls controls_;
+  Beep beep_;
 };
 
 }  // namespace marlowbeck

@@ -3,7 +3,6 @@
 #include <algorithm>
 
 #include "data/numbers.h"
-#include "session/messages.h"
 
 namespace marlowbeck {
 namespace {
@@ -50,7 +49,7 @@ bool PrintPanel::Check(std::initializer_list<const OptionButton*> options,
   const bool any = std::any_of(options.begin(), options.end(),
                                [](const OptionButton* option) { return option->Value(); });
   if (any) return CheckDistance() && CheckCopies();
-  Warning(context_, none_selected);
+  Warning(context_, none_selected, beep_);
   return false;
 }
 
@@ -65,7 +64,7 @@ bool PrintPanel::CheckCopies() {
 
 bool PrintPanel::AtLeastOne(std::string_view text, std::string_view message) {
   if (Val(text) >= 1) return true;
-  Warning(context_, message);
+  Warning(context_, message, beep_);
   return false;
 }
 

@@ -5,6 +5,7 @@
 #include <string_view>
 
 #include "print/print_job.h"
+#include "session/messages.h"
 #include "ui/controls.h"
 
 namespace marlowbeck {
@@ -26,8 +27,9 @@ class PrintPanel {
     ComboBox* from_top = nullptr;  ///< null where the distance from the top is not chosen
   };
 
-  PrintPanel(const Context& context, const Controls& controls)
-      : context_(context), controls_(controls) {}
+  /// `beep` is that of its warnings.
+  PrintPanel(const Context& context, const Controls& controls, Beep beep = Beep::No)
+      : context_(context), controls_(controls), beep_(beep) {}
 
   /// Shows the printer's name and which way round its paper is.
   void PrinterInfo();
@@ -50,6 +52,7 @@ class PrintPanel {
 
   const Context& context_;
   Controls controls_;
+  Beep beep_;
 };
 
 }  // namespace marlowbeck

@@ -116,7 +116,7 @@ class Control {
   Handler MouseMove;
   Handler MouseUp;  ///< the button has come up over a list, after what the click did
   Handler KeyUp;    ///< a key has come up in a list
-  Handler Entered;  ///< Enter in an entry box, in the place of a Tab
+  Handler Entered;  ///< Enter, in the place of a Tab or of a pick
 
   /// Runs a handler of this control, if there is one, through the dispatcher.
   void Fire(const Handler& handler) const;

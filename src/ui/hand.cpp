@@ -363,6 +363,7 @@ void Hand::PressOn(Control* focus, Screen& front, Key key) {
 }
 
 void Hand::PressEnter(Control* focus, Screen& front) {
+  if (focus != nullptr && focus->Entered) return focus->Fire(focus->Entered);
   if (focus != nullptr) {
     switch (focus->GetKind()) {
       case Kind::Command:
@@ -370,7 +371,6 @@ void Hand::PressEnter(Control* focus, Screen& front) {
         return focus->Fire(focus->Click);
       case Kind::Text:
       case Kind::Combo:
-        if (focus->Entered) return focus->Fire(focus->Entered);
         // Enter in an entry box is a Tab.
         if (Control* const next = front.NextStop(false)) next->SetFocus();
         return;
@@ -394,6 +394,8 @@ void Hand::PressEnter(Control* focus, Screen& front) {
 
 void Hand::MoveLine(LineHolder& list, int step) {
   const auto* box = As<ListBox>(list);
+  // Where Enter has taken the line away, the next one stands in its place.
+  if (box != nullptr && box->Entered && box->Index() < 0) return GoToLine(list, box->Cursor());
   GoToLine(list, (box != nullptr && box->PicksOnEnter() ? box->Cursor() : list.Index()) + step);
 }
 

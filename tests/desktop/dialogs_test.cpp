@@ -8,6 +8,7 @@
 #include <QFileDialog>
 #include <QFontDialog>
 #include <QLineEdit>
+#include <QMessageBox>
 #include <QPushButton>
 #include <QRadioButton>
 #include <QTimer>
@@ -117,6 +118,24 @@ TEST_F(FileDialogs, LeaveTheQuestionAboutAnExistingFileToTheProgram) {
   Answer("Winter.qza", QDialogButtonBox::Save);
   EXPECT_EQ(dialogs_.File(Asking(kSave)), FromQt(folder_.Path("Winter.qza")));
   EXPECT_EQ(seen_, 1);
+}
+
+TEST_F(FileDialogs, AskAboutAnExistingFileThemselvesWhereTheyAreTo) {
+  int asked = 0;
+  OnceUp<QFileDialog>([&asked](QFileDialog& dialog) {
+    NameBox(dialog).setText("Winter.qza");
+    QTimer::singleShot(0, qApp, [&asked] {
+      auto* const question = dynamic_cast<QMessageBox*>(QApplication::activeModalWidget());
+      ASSERT_NE(question, nullptr);
+      ++asked;
+      question->reject();
+    });
+    Press(dialog, QDialogButtonBox::Save);
+  });
+  FileDialogRequest request = Asking(kSave);
+  request.asks_before_overwriting = true;
+  EXPECT_EQ(dialogs_.File(request), std::nullopt) << "it is not to be written over";
+  EXPECT_EQ(asked, 1);
 }
 
 TEST_F(FileDialogs, AnswerANameInTheProgramsLetters) {

@@ -415,6 +415,32 @@ TEST_F(HandTest, AListThatPicksOnEnterMovesACursorUntilThen) {
   EXPECT_EQ(a.lstA.Cursor(), 0) << "never below the last line";
 }
 
+TEST_F(HandTest, EnterGoesToAListOrATableThatWantsIt) {
+  FillList();
+  a.grdA.SetSize(2, 2);
+  a.lstA.Entered = [this] { log.push_back("entered lstA"); };
+  a.grdA.Entered = [this] { log.push_back("entered grdA"); };
+  hand.Pick(a.lstA, 1);
+  log.clear();
+  hand.Press(Key::Enter);
+  EXPECT_EQ(a.lstA.Index(), 1);
+  hand.ClickCell(a.grdA, 1, 1);
+  hand.Press(Key::Enter);
+  EXPECT_EQ(Happened(),
+            (Log{"entered lstA", "lost lstA", "got grdA", "click grdA", "entered grdA"}));
+}
+
+TEST_F(HandTest, TheArrowsGoOnWhereEnterHasTakenALineAway) {
+  FillList();
+  a.lstA.Entered = [this] { a.lstA.RemoveLine(a.lstA.Index()); };
+  hand.Pick(a.lstA, 1);
+  const std::string next = a.lstA.Line(2);
+  hand.Press(Key::Enter);
+  EXPECT_EQ(a.lstA.Index(), -1);
+  hand.Press(Key::Down);
+  EXPECT_EQ(a.lstA.Line(a.lstA.Index()), next);
+}
+
 TEST_F(HandTest, AMnemonicGoesToItsControl) {
   hand.PressMnemonic('v');
   EXPECT_EQ(Happened(), (Log{"lost txtA", "got cmdA", "click cmdA"}));

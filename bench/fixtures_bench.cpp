@@ -1,18 +1,13 @@
 // From the answer of the entry dialog to the painted chart of 50 teams, against a frame of a
 // display that shows sixty in a second.
 
-#include <filesystem>
 #include <string>
 
-#include <QApplication>
 #include <benchmark/benchmark.h>
 
+#include "bench/desk.h"
 #include "bench/ratios.h"
-#include "data/real_file_system.h"
 #include "desktop/theme.h"
-#include "desktop/windows.h"
-#include "program/program.h"
-#include "tests/desktop/still_world.h"
 
 namespace marlowbeck::bench {
 namespace {
@@ -30,37 +25,16 @@ class FiftyTeams : public StillWorld {
   std::string ShowInput(const InputBoxRequest& /*request*/) override { return "50"; }
 };
 
-std::string TemporaryFolder() {
-  std::string pattern = (std::filesystem::temp_directory_path() / "marlowbeck-XXXXXX").string();
-  if (mkdtemp(pattern.data()) == nullptr) std::abort();
-  return pattern;
-}
-
 void ChartOfFiftyTeams(benchmark::State& state) {
-  const std::string folder = TemporaryFolder();
-  {
-    FiftyTeams world;
-    RealFileSystem files;
-    Program program(world.platform, files, folder);
-    Windows windows(program.GetScreens(), program.GetHand(), [] {});
-    program.Start();
-    windows.Refresh();
-    const auto click = [&](const char* screen, const char* control) {
-      Control& clicked = *program.GetScreens().Find(screen)->Find(control);
-      windows.Do(nullptr, [&](Hand& hand) { return hand.Click(clicked); });
-      QApplication::processEvents();
-    };
-    for (auto _ : state) {
-      click("frmDB", "mnuFix");
-      const Screen* const fixtures = program.GetScreens().Find("frmFixtures");
-      if (fixtures == nullptr) return state.SkipWithError("no chart");
-      windows.WindowOf(*fixtures)->Window().repaint();
-      state.PauseTiming();
-      click("frmFixtures", "cmdFixCancel");
-      state.ResumeTiming();
-    }
+  FiftyTeams world;
+  Desk desk(world.platform);
+  desk.Start();
+  for (auto _ : state) {
+    desk.Click("frmDB", "mnuFix");
+    state.PauseTiming();
+    desk.Click("frmFixtures", "cmdFixCancel");
+    state.ResumeTiming();
   }
-  std::filesystem::remove_all(folder);
 }
 BENCHMARK(ChartOfFiftyTeams)->Unit(benchmark::kMillisecond)->UseRealTime();
 

@@ -17,6 +17,8 @@ void SideFile(Input input);
 void Records(Input input);
 /// A ladder file and the rules of its table, through the table, its plain model and the sort.
 void Ladder(Input input);
+/// The list file of a knock-out, through its reader, the draw and its writer.
+void KnockOut(Input input);
 /// A text typed or read: as a number, a date, and between the code page and Unicode.
 void Words(Input input);
 

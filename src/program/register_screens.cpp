@@ -4,6 +4,7 @@
 
 #include "filecopy/frmBackup.h"
 #include "fixtures/frmFixtures.h"
+#include "knockout/frmKnockOut.h"
 #include "ladder/frmLadder.h"
 #include "results/frmChangeDate.h"
 #include "results/frmEdScore.h"
@@ -49,6 +50,7 @@ void RegisterScreens(Screens& screens, const Context& context) {
   Register<frmPegRatio>(screens, "frmPegRatio", context);
   Register<frmPlayersLists>(screens, "frmPlayersLists", context);
   Register<frmSearchPlayer>(screens, "frmSearchPlayer", context);
+  Register<frmKnockOut>(screens, "frmKnockOut", context);
   Register<frmFixtures>(screens, "frmFixtures", context);
   Register<frmBackup>(screens, "frmBackup", context);
   Register<frmErrors>(screens, "frmErrors", context);

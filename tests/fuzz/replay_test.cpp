@@ -34,6 +34,7 @@ void Replay(const std::string& corpus, void (*target)(Input)) {
 TEST(FuzzReplay, SideFiles) { Replay("side_file", SideFile); }
 TEST(FuzzReplay, PlayersAndResults) { Replay("records", Records); }
 TEST(FuzzReplay, TheLadderAndItsRules) { Replay("ladder", Ladder); }
+TEST(FuzzReplay, ListsOfAKnockOut) { Replay("knockout", KnockOut); }
 TEST(FuzzReplay, Words) { Replay("words", Words); }
 
 }  // namespace

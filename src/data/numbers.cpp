@@ -3,10 +3,13 @@
 #include <array>
 #include <charconv>
 #include <cmath>
+#include <cstdint>
 #include <system_error>
 
 namespace marlowbeck {
 namespace {
+
+constexpr double kMostDigits = 1e15;  // whole numbers below it have no more than 15
 
 std::string_view WithoutLeadingBlanks(std::string_view text) {
   const auto first = text.find_first_not_of(" \t");
@@ -74,7 +77,9 @@ Integer CInt(std::string_view text) { return Integer::Narrow(NumberOf(text)); }
 double Int(double value) { return std::floor(value); }
 
 std::string NumberText(double value) {
-  if (value == 0) return "0";  // also for -0
+  if (std::abs(value) < kMostDigits && value == std::floor(value)) {
+    return std::to_string(static_cast<std::int64_t>(value));  // "0" for -0 too
+  }
   return Written(value, std::chars_format::general, 15);
 }
 

@@ -8,7 +8,8 @@
 namespace marlowbeck {
 
 SideFileWriter& SideFileWriter::Text(std::string_view text) {
-  Item('"' + std::string(text) + '"');
+  Item("\"");
+  content_.append(text).append(1, '"');
   return *this;
 }
 

@@ -1,6 +1,6 @@
 #include "stats/combined_list.h"
 
-#include <algorithm>
+#include <utility>
 
 #include "data/integer.h"
 #include "data/numbers.h"
@@ -57,12 +57,8 @@ std::vector<CombinedRow> CombinedAverages::Rows() const {
 
 std::vector<CombinedRow> Ordered(std::vector<CombinedRow> rows, CombinedOrder order) {
   rows = order == CombinedOrder::ByAverage
-             ? SortedFromTheLast(
-                   std::move(rows),
-                   [](const CombinedRow& a, const CombinedRow& b) { return a.avg < b.avg; })
-             : SortedFromTheLast(std::move(rows), [](const CombinedRow& a, const CombinedRow& b) {
-                 return a.name >= b.name;
-               });
+             ? HighestFirst(std::move(rows), [](const CombinedRow& row) { return row.avg; })
+             : AToZ(std::move(rows));
   std::erase_if(rows, [](const CombinedRow& row) { return !(row.avg > 0); });
   return rows;
 }

@@ -12,6 +12,7 @@ using LastTab = TabbedText::LastTab;
 void AddRows(TabbedText& text, const Grid& grid, int first, LastTab last_tab) {
   for (int row = first; row < grid.Rows(); ++row) {
     std::vector<std::string> cells;
+    cells.reserve(static_cast<std::size_t>(grid.Cols()));
     for (int col = 0; col < grid.Cols(); ++col) cells.push_back(grid.Cell(row, col));
     text.Row(cells, last_tab);
   }

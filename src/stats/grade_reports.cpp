@@ -54,7 +54,7 @@ void CalcHi(Session& session, Channels& channels) {
     session.HiLabel = HeadingOf(ListInHand(session), ListSpan::OneDate);
     ReadPlayers(session, channels, [&](const PlayerView& player) { highest.AddPlayer(player); });
   }
-  KeepHighest(session, channels, highest.Rows());
+  KeepHighest(session, channels, highest.TakeRows());
 }
 
 void CalcHiProg(Session& session, Channels& channels) {

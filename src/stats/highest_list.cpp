@@ -1,6 +1,7 @@
 #include "stats/highest_list.h"
 
 #include <algorithm>
+#include <utility>
 
 #include "data/integer.h"
 #include "data/numbers.h"
@@ -48,11 +49,8 @@ double ValueOfDate(HighestOf list, const ResultView& result) {
   return result.Scores180();
 }
 
-/// Equal values are swapped, and all is turned round in the end: two alone stay as they were, more
-/// as the pass leaves them.
-std::vector<HighestRow> HighestFirst(std::vector<HighestRow> rows) {
-  return SortedFromTheLast(
-      std::move(rows), [](const HighestRow& a, const HighestRow& b) { return a.value < b.value; });
+std::vector<HighestRow> ByValue(std::vector<HighestRow> rows) {
+  return HighestFirst(std::move(rows), [](const HighestRow& row) { return row.value; });
 }
 
 void DropWithoutValue(std::vector<HighestRow>& rows) {
@@ -79,29 +77,34 @@ std::string_view HeadingOf(HighestOf list, ListSpan span) {
   return "180's";
 }
 
-void HighestOfDate::AddResult(const ResultView& result) {
-  if (result.GameDate() != date_ || !HasPointsAndShots(result)) return;
+void HighestOfDate::AddResultOfDate(const ResultView& result) {
+  if (!HasPointsAndShots(result)) return;
   if (rows_.size() == kReportPlaces) throw RunTimeError(ErrorNumber::SubscriptOutOfRange);
-  rows_.push_back({result.ID(), {}, std::string(result.Team()), ValueOfDate(list_, result), 0});
-  places_.push_back(ids_.Add(result.ID()));
-  names_.resize(static_cast<std::size_t>(ids_.Count()));
+  const auto id = static_cast<std::size_t>(ids_.Add(result.ID()));
+  if (id == waiting_.size()) waiting_.emplace_back();
+  same_id_before_.push_back(std::exchange(waiting_[id].last, static_cast<int>(rows_.size())));
+  HighestRow& row = rows_.emplace_back();
+  row.id = result.ID();
+  row.value = ValueOfDate(list_, result);
+  if (row.value > 0) row.team = result.Team();
 }
 
+// KEPT: a player who is in the file no more stays in a list of one date, without a name, and drops
+// out of the progressive one; a repair would leave the row out of both.
 void HighestOfDate::AddPlayer(const PlayerView& player) {
-  const int place = ids_.Find(player.ID());
-  if (place == IdIndex::kNone) return;
-  auto& name = names_[static_cast<std::size_t>(place)];
-  if (!name) name = player.FullName(", ");
+  const int id = ids_.Find(player.ID());
+  if (id == IdIndex::kNone) return;
+  Waiting& waiting = waiting_[static_cast<std::size_t>(id)];
+  if (std::exchange(waiting.named, true)) return;
+  for (int row = waiting.last; row != kNone; row = same_id_before_[static_cast<std::size_t>(row)]) {
+    HighestRow& waiter = rows_[static_cast<std::size_t>(row)];
+    if (waiter.value > 0) waiter.name = player.FullName(", ");
+  }
 }
 
-std::vector<HighestRow> HighestOfDate::Rows() const {
-  std::vector<HighestRow> rows = rows_;
-  // KEPT: a player who is in the file no more stays in a list of one date, without a name, and
-  // drops out of the progressive one; a repair would leave the row out of both.
-  for (std::size_t i = 0; i < rows.size(); ++i) {
-    rows[i].name = names_[static_cast<std::size_t>(places_[i])].value_or(std::string());
-  }
-  rows = HighestFirst(std::move(rows));
+/// Those without a value are sorted too: how many there are has a say in where equal ones end up.
+std::vector<HighestRow> HighestOfDate::TakeRows() {
+  std::vector<HighestRow> rows = ByValue(std::exchange(rows_, {}));
   DropWithoutValue(rows);
   return rows;
 }
@@ -162,7 +165,7 @@ std::vector<HighestRow> HighestUpToDate::Rows() const {
     rows.back().value = value;
     rows.back().games = sums.games;
   }
-  return HighestFirst(std::move(rows));
+  return ByValue(std::move(rows));
 }
 
 void WriteHighest(SideFileWriter& writer, const std::vector<HighestRow>& rows) {

@@ -2,7 +2,6 @@
 
 #include <array>
 #include <cstdint>
-#include <optional>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -40,21 +39,34 @@ class HighestOfDate {
 
   /// A result without points or without shots, as a forfeit's, counts for no list. Throws
   /// SubscriptOutOfRange past 1000 results of the date.
-  void AddResult(const ResultView& result);
+  void AddResult(const ResultView& result) {
+    if (result.GameDate() == date_) AddResultOfDate(result);
+  }
   /// Of several players with one id the first one counts.
   void AddPlayer(const PlayerView& player);
 
   [[nodiscard]] bool Any() const { return !rows_.empty(); }
-  /// Those with a value above 0, the highest first. A row to a result, with the result's team.
-  [[nodiscard]] std::vector<HighestRow> Rows() const;
+  /// Those with a value above 0, the highest first. A row to a result, with the result's team. They
+  /// are handed over once.
+  [[nodiscard]] std::vector<HighestRow> TakeRows();
 
  private:
+  static constexpr int kNone = -1;
+
+  /// The rows of one id, which wait for its player's name.
+  struct Waiting {
+    int last = kNone;
+    bool named = false;
+  };
+
+  void AddResultOfDate(const ResultView& result);
+
   HighestOf list_;
   Date date_;
-  std::vector<HighestRow> rows_;  ///< still without names
-  std::vector<int> places_;       ///< of their ids
+  std::vector<HighestRow> rows_;
+  std::vector<int> same_id_before_;  ///< the row before each with its id
   IdIndex ids_;
-  std::vector<std::optional<std::string>> names_;  ///< in the ids' places, once found
+  std::vector<Waiting> waiting_;  ///< in the ids' places
 };
 
 /// The highest of everything up to a date and with it. It is handed every player record in file

@@ -11,6 +11,7 @@ constexpr std::size_t kColumnsWithGames = 5;
 
 std::vector<std::string> RowOf(const Grid& grid, int row) {
   std::vector<std::string> cells;
+  cells.reserve(static_cast<std::size_t>(grid.Cols()));
   for (int col = 0; col < grid.Cols(); ++col) cells.push_back(grid.Cell(row, col));
   return cells;
 }

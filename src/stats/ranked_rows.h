@@ -5,28 +5,45 @@
 #include <vector>
 
 #include "data/gap_sort.h"
+#include "data/gap_sort_by_value.h"
 
 namespace marlowbeck {
 
-/// Rows as the sorting pass leaves them, handed over from the last to the first: an ascending test
-/// gives the highest first. `in_order(a, b)` is the pass's test of two rows.
-template <typename Row, typename InOrder>
-std::vector<Row> SortedFromTheLast(std::vector<Row> rows, InOrder in_order) {
-  std::vector<std::size_t> order(rows.size());
-  std::iota(order.begin(), order.end(), std::size_t{0});
-  const auto at = [&](int place) -> std::size_t& {
-    return order[static_cast<std::size_t>(place - 1)];
+/// Rows in the order of their places, from the last to the first.
+template <typename Row>
+std::vector<Row> FromTheLast(std::vector<Row> rows, const std::vector<int>& places) {
+  std::vector<Row> turned;
+  turned.reserve(rows.size());
+  for (auto place = places.rbegin(); place != places.rend(); ++place) {
+    turned.push_back(std::move(rows[static_cast<std::size_t>(*place)]));
+  }
+  return turned;
+}
+
+/// Rows with the highest value first: as the sorting pass leaves them when it swaps equal ones, and
+/// turned round. Two equal rows alone stay as they were, more of them do not.
+template <typename Row, typename ValueOf>
+std::vector<Row> HighestFirst(std::vector<Row> rows, ValueOf value_of) {
+  std::vector<double> values;
+  values.reserve(rows.size());
+  for (const Row& row : rows) values.push_back(value_of(row));
+  return FromTheLast(std::move(rows), GapSortByValue(values));
+}
+
+/// Rows with names from A to Z by their bytes: as the sorting pass leaves them descending, equal
+/// ones in order, and turned round.
+template <typename Row>
+std::vector<Row> AToZ(std::vector<Row> rows) {
+  std::vector<int> places(rows.size());
+  std::iota(places.begin(), places.end(), 0);
+  const auto at = [&](int place) -> int& { return places[static_cast<std::size_t>(place - 1)]; };
+  const auto name = [&](int place) -> const std::string& {
+    return rows[static_cast<std::size_t>(at(place))].name;
   };
   GapSort(
-      static_cast<int>(rows.size()),
-      [&](int j, int k) { return in_order(rows[at(j)], rows[at(k)]); },
+      static_cast<int>(rows.size()), [&](int j, int k) { return name(j) >= name(k); },
       [&](int j, int k) { std::swap(at(j), at(k)); });
-  std::vector<Row> sorted;
-  sorted.reserve(rows.size());
-  for (auto place = order.rbegin(); place != order.rend(); ++place) {
-    sorted.push_back(std::move(rows[*place]));
-  }
-  return sorted;
+  return FromTheLast(std::move(rows), places);
 }
 
 }  // namespace marlowbeck

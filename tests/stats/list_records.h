@@ -14,7 +14,7 @@ inline std::vector<HighestRow> OfDate(const Competition& competition, HighestOf 
   HighestOfDate highest(list, Date{date});
   HandOver<ResultView>(competition.results, [&](ResultView view) { highest.AddResult(view); });
   HandOver<PlayerView>(competition.players, [&](PlayerView view) { highest.AddPlayer(view); });
-  return highest.Rows();
+  return highest.TakeRows();
 }
 
 inline std::vector<HighestRow> UpTo(const Competition& competition, HighestOf list, double until) {

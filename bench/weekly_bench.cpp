@@ -2,13 +2,11 @@
 // against a plain read of the same two files, and against the time that a database takes to answer
 // the same two questions from indexed tables of the same data.
 
-#include <sstream>
-#include <stdexcept>
 #include <string>
 
 #include <benchmark/benchmark.h>
-#include <sqlite3.h>
 
+#include "bench/database.h"
 #include "bench/ratios.h"
 #include "bench/season.h"
 #include "data/channels.h"
@@ -55,92 +53,6 @@ void CalcWeeklyAndCalcProg(benchmark::State& state) {
 }
 BENCHMARK(CalcWeeklyAndCalcProg)->Unit(benchmark::kMicrosecond)->UseRealTime();
 
-/// The two files as tables in a database file beside them, with the indexes that the questions
-/// want.
-class Database {
- public:
-  Database() {
-    Check(sqlite3_open((InOrder().Folder() + "/season.db").c_str(), &database_));
-    Run("CREATE TABLE player(id INTEGER, name TEXT, team TEXT, grade TEXT);"
-        "CREATE TABLE result(id INTEGER, team TEXT, opposition TEXT, day REAL, forfeit TEXT,"
-        " agg INTEGER, shots INTEGER, hs INTEGER, c100 INTEGER, c180 INTEGER,"
-        " p1 INTEGER, p2 INTEGER, p3 INTEGER, p4 INTEGER, p5 INTEGER, p6 INTEGER);"
-        "BEGIN;");
-    Fill();
-    Run("COMMIT;"
-        "CREATE INDEX player_id ON player(id);"
-        "CREATE INDEX player_team ON player(team, grade);"
-        "CREATE INDEX result_night ON result(team, day);"
-        "CREATE INDEX result_player ON result(id, day);"
-        "ANALYZE;");
-  }
-  Database(const Database&) = delete;
-  Database& operator=(const Database&) = delete;
-  ~Database() { sqlite3_close(database_); }
-
-  /// Steps through all rows of a question with two or three values; answers how many they are.
-  int Ask(const std::string& question) {
-    sqlite3_stmt* statement = nullptr;
-    Check(sqlite3_prepare_v2(database_, question.c_str(), -1, &statement, nullptr));
-    int rows = 0;
-    while (sqlite3_step(statement) == SQLITE_ROW) {
-      for (int column = 0; column < sqlite3_column_count(statement); ++column) {
-        benchmark::DoNotOptimize(sqlite3_column_text(statement, column));
-      }
-      ++rows;
-    }
-    sqlite3_finalize(statement);
-    return rows;
-  }
-
- private:
-  static void Check(int code) {
-    if (code != SQLITE_OK) throw std::runtime_error(sqlite3_errstr(code));
-  }
-  void Run(const std::string& sql) {
-    Check(sqlite3_exec(database_, sql.c_str(), nullptr, nullptr, nullptr));
-  }
-
-  static std::string Quoted(std::string_view text) {
-    std::ostringstream quoted;
-    quoted << '\'' << text << '\'';
-    return quoted.str();
-  }
-
-  void Fill() {
-    RealFileSystem files;
-    Channels channels(files);
-    channels.OpenRandom(Channel::Players, InOrder().PlayerFile(), kPlayerLength);
-    channels.ForEachRecord(Channel::Players, [&](Bytes bytes, int) {
-      const PlayerView player(bytes);
-      std::ostringstream sql;
-      sql << "INSERT INTO player VALUES(" << player.ID() << ',' << Quoted(player.FullName(", "))
-          << ',' << Quoted(player.Team()) << ',' << Quoted(player.Grade()) << ')';
-      Run(sql.str());
-    });
-    channels.OpenRandom(Channel::Results, InOrder().ResultsFile(), kResultLength);
-    channels.ForEachRecord(Channel::Results, [&](Bytes bytes, int) { Insert(ResultView(bytes)); });
-    channels.CloseAll();
-  }
-
-  void Insert(const ResultView& result) {
-    std::ostringstream sql;
-    sql << "INSERT INTO result VALUES(" << result.ID() << ',' << Quoted(result.Team()) << ','
-        << Quoted(result.Opposition()) << ',' << result.GameDate().days << ','
-        << Quoted(result.IsForfeit() ? "F" : "");
-    for (const int figure :
-         {int{result.Aggregate()}, int{result.Shots()}, int{result.HighScore()},
-          int{result.Centuries()}, int{result.Scores180()}, int{result.Peg(0)}, int{result.Peg(1)},
-          int{result.Peg(2)}, int{result.Peg(3)}, int{result.Peg(4)}, int{result.Peg(5)}}) {
-      sql << ',' << figure;
-    }
-    sql << ')';
-    Run(sql.str());
-  }
-
-  sqlite3* database_ = nullptr;
-};
-
 std::string WeeklyQuestion() {
   const std::string day = std::to_string(Season::GameDate(kNight).days);
   return "SELECT p.name, r.opposition, r.agg, r.shots, r.c180, r.c100, r.hs, r.p1, r.p2, r.p3,"
@@ -161,7 +73,12 @@ std::string ProgressiveQuestion() {
 }
 
 void DatabaseAnswers(benchmark::State& state) {
-  static Database database;
+  static Database database(InOrder().Folder() + "/season.db", InOrder().PlayerFile(),
+                           {{kGrade, InOrder().ResultsFile()}},
+                           "CREATE INDEX player_id ON player(id);"
+                           "CREATE INDEX player_team ON player(team, grade);"
+                           "CREATE INDEX result_night ON result(team, day);"
+                           "CREATE INDEX result_player ON result(id, day);");
   for (auto _ : state) {
     if (database.Ask(WeeklyQuestion()) == 0 || database.Ask(ProgressiveQuestion()) == 0) {
       state.SkipWithError("no rows");

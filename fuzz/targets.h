@@ -19,6 +19,9 @@ void Records(Input input);
 void Ladder(Input input);
 /// The list file of a knock-out, through its reader, the draw and its writer.
 void KnockOut(Input input);
+/// A player file and a results file through the lists of the highest, and the bytes as the side
+/// files of those.
+void Lists(Input input);
 /// A text typed or read: as a number, a date, and between the code page and Unicode.
 void Words(Input input);
 

@@ -35,6 +35,7 @@ TEST(FuzzReplay, SideFiles) { Replay("side_file", SideFile); }
 TEST(FuzzReplay, PlayersAndResults) { Replay("records", Records); }
 TEST(FuzzReplay, TheLadderAndItsRules) { Replay("ladder", Ladder); }
 TEST(FuzzReplay, ListsOfAKnockOut) { Replay("knockout", KnockOut); }
+TEST(FuzzReplay, TheListsAndTheirSideFiles) { Replay("lists", Lists); }
 TEST(FuzzReplay, Words) { Replay("words", Words); }
 
 }  // namespace

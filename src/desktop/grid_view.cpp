@@ -1,5 +1,6 @@
 #include "desktop/grid_view.h"
 
+#include <algorithm>
 #include <numeric>
 
 #include <QHeaderView>
@@ -113,6 +114,7 @@ void GridView::FitColumns() {
   widths.reserve(static_cast<std::size_t>(cols));
   for (int col = 0; col < cols; ++col) widths.push_back(WidthOfColumn(col));
   int spare = table_.viewport()->width() - std::accumulate(widths.begin(), widths.end(), 0);
+  const bool whole = spare >= 0;
   const int sharing = cols - first_names_;
   for (int col = first_names_; spare > 0 && col < cols; ++col) {
     widths[AsIndex(col)] += spare / sharing + (col - first_names_ < spare % sharing);
@@ -124,7 +126,16 @@ void GridView::FitColumns() {
     spare += full - width;
   }
   for (int col = 0; col < cols; ++col) table_.setColumnWidth(col, widths[AsIndex(col)]);
-  FitRows();
+  FitRows(whole && !HasLineBreaks() ? RowHeights::Alike : RowHeights::AsNeeded);
+}
+
+bool GridView::HasLineBreaks() const {
+  return std::any_of(shown_cells_.begin(), shown_cells_.end(), [this](const auto& row) {
+    return &row - shown_cells_.data() >= heading_rows_ &&
+           std::any_of(row.begin(), row.end(), [](const std::string& cell) {
+             return cell.find('\r') != std::string::npos;
+           });
+  });
 }
 
 /// A column of figures is no narrower than they are; the others part what is left.
@@ -150,7 +161,7 @@ void GridView::ShareOutColumns() {
   for (int col = 0; col < cols; ++col) {
     if (share(col) == widest) table_.setColumnWidth(col, room * widest / parts);
   }
-  FitRows();
+  FitRows(RowHeights::AsNeeded);
 }
 
 int GridView::WidthOfColumn(int col) const {
@@ -170,15 +181,20 @@ int GridView::LeastWidthOfNames(int col) const {
   return least;
 }
 
-/// A row is as high as its name takes.
-void GridView::FitRows() {
+/// A row is as high as its name takes. Where no text is broken they are all alike, and a thousand
+/// need not be measured.
+void GridView::FitRows(RowHeights heights) {
   int height = 2 * table_.frameWidth();
   if (heading_rows_ > 0) height += table_.horizontalHeader()->sizeHint().height();
   const int least_rows = table_.property(kLeastRows).toInt();
   int least = height;
+  int row_height = 0;
   for (int row = 0; row < table_.rowCount(); ++row) {
-    table_.setRowHeight(row, std::max(kRowHeight, AsView().sizeHintForRow(row)));
-    height += table_.rowHeight(row);
+    if (row == 0 || heights == RowHeights::AsNeeded) {
+      row_height = std::max(kRowHeight, AsView().sizeHintForRow(row));
+    }
+    if (table_.rowHeight(row) != row_height) table_.setRowHeight(row, row_height);
+    height += row_height;
     if (row < least_rows) least = height;
   }
   if (least_rows == 0) return;

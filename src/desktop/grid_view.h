@@ -28,7 +28,9 @@ class GridView : public CaptionedView {
   bool eventFilter(QObject* watched, QEvent* event) override;
   void FitColumns();
   void ShareOutColumns();
-  void FitRows();
+  enum class RowHeights { Alike, AsNeeded };
+  void FitRows(RowHeights heights);
+  [[nodiscard]] bool HasLineBreaks() const;
   /// A table hides its measures, which are every view's.
   [[nodiscard]] const QAbstractItemView& AsView() const { return table_; }
   [[nodiscard]] int WidthOfColumn(int col) const;

@@ -112,10 +112,10 @@ void ComboView::ShowKind() {
   // Another current line would take the cursor out of what is being typed.
   const int cursor = box_.isEditable() ? box_.lineEdit()->cursorPosition() : 0;
   ShowLines();
+  // Before the line: where none is current the box goes to its first one once this is empty.
+  if (!box_.isEditable()) box_.setPlaceholderText(ToQt(model_.Text()));
   if (box_.currentIndex() != model_.Index()) box_.setCurrentIndex(model_.Index());
-  if (!box_.isEditable()) {
-    box_.setPlaceholderText(ToQt(model_.Text()));
-  } else if (FromQt(box_.currentText()) != model_.Text()) {
+  if (box_.isEditable() && FromQt(box_.currentText()) != model_.Text()) {
     box_.setEditText(ToQt(model_.Text()));
     box_.lineEdit()->setCursorPosition(cursor);
   }

@@ -20,7 +20,7 @@ Json DateAsJson(Date date) {
   }
 }
 
-Json DateOrNull(Date date) { return date.IsSet() ? DateAsJson(date) : Json(); }
+Json DateOrNull(Date date) { return date == Date{} ? Json() : DateAsJson(date); }
 
 const char* WordOf(Meaning meaning) {
   switch (meaning) {

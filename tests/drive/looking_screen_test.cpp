@@ -119,6 +119,20 @@ TEST_F(Looking, StateOfADateThatNoCalendarHasIsNull) {
   EXPECT_TRUE(Get("dtpDay")["value"].is_null());
 }
 
+TEST_F(Looking, StateOfALockedComboWhoseTextHasGoneHasNoLine) {
+  for (const int line : {-1, 1}) {
+    Change([line](Workbench& bench) {
+      bench.cboLocked.SetText("none of the lines");
+      bench.cboLocked.SetIndex(line);
+    });
+    EXPECT_EQ(Get("cboLocked")["index"], line);
+    Change([](Workbench& bench) { bench.cboLocked.SetText(""); });
+    EXPECT_EQ(Text("cboLocked"), "");
+    EXPECT_EQ(Get("cboLocked")["index"], -1);
+    EXPECT_EQ(Get("cboLocked")["lines"].size(), 3U);
+  }
+}
+
 TEST_F(Looking, StateHasEveryControlOfAScreen) {
   const Json controls = Do("state")["controls"];
   OnDo([&](Workbench& bench) {
@@ -138,7 +152,7 @@ TEST_F(Looking, SessionTellsEveryFieldWithNullForNoDate) {
         "A Gr\xE4"
         "de";
     context.session.WorkDate = *DateFromCivil({2004, 3, 31});
-    context.session.TeamDates = {*DateFromCivil({2004, 4, 7}), Date{}};
+    context.session.TeamDates = {*DateFromCivil({2004, 4, 7}), Date{}, Date{-1}};
     context.session.PlayerCount = 32767;
     context.session.Quiet = true;
   });
@@ -148,7 +162,7 @@ TEST_F(Looking, SessionTellsEveryFieldWithNullForNoDate) {
             "A Gr\xC3\xA4"
             "de");
   EXPECT_EQ(InSession("WorkDate"), "2004-03-31");
-  EXPECT_EQ(InSession("TeamDates"), Json::parse(R"(["2004-04-07", null])"));
+  EXPECT_EQ(InSession("TeamDates"), Json::parse(R"(["2004-04-07", null, "1899-12-29"])"));
   EXPECT_EQ(InSession("PlayerCount"), 32767);
   EXPECT_EQ(InSession("Quiet"), true);
   EXPECT_EQ(InSession("GameNames").size(), 6U);

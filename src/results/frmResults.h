@@ -96,6 +96,7 @@ struct frmResults : Screen {
   // Grade and date.
   void Start();
   void StartAgain(const std::string& competition);
+  void BackToGradeAndDate(bool over_teams);
   void StartScores();
   void UpdateTeamsInfo();
   void cmdExit_Click();

@@ -73,8 +73,21 @@ void frmResults::StartScores() {
   // The teams are listed for the date picked here, not for the one that was worked on before.
   session.WorkDate = Cal.Value();
   EdCal.SetValue(session.WorkDate);
-  UpdateTeamsInfo();
+  const bool over_teams = fraTeams.Visible();
+  try {
+    UpdateTeamsInfo();
+  } catch (const RunTimeError&) {
+    if (fraChangeGrade.Visible()) BackToGradeAndDate(over_teams);
+    throw;
+  }
   cmdMakeWorkDate.SetCaption("Work Date: " + ShortDate(session.WorkDate));
+}
+
+/// The teams could not be listed: what was up for them would lie over what is to be picked again.
+void frmResults::BackToGradeAndDate(bool over_teams) {
+  fraResControls.Hide();
+  fraTeams.SetVisible(over_teams);
+  fraTeams.Disable();
 }
 
 /// The first player of the grade gives the team in hand; a later one of another team is the second.

@@ -126,6 +126,27 @@ TEST_F(GradeAndDate, AFlagOfAnotherScreenIsNoFailedCheck) {
   EXPECT_EQ(InSession("Flag"), 0);
 }
 
+TEST_F(GradeAndDate, TeamsThatCannotBeListedLeaveGradeAndDateToBePickedAgain) {
+  for (const bool over_teams : {false, true}) {
+    int stopped = 0;
+    for (int open = 1; open <= 12; ++open) {
+      Do("click imgSheets");
+      if (over_teams) DoAll({"click cmdGotoResults", "click cmdChangeGrade"});
+      DoAll({"fault open " + std::to_string(open) + " 75", "click cmdGotoResults", "fault off"});
+      if (Shown("fraChangeGrade")) {
+        ++stopped;
+        EXPECT_FALSE(Shown("fraResControls")) << open;
+        EXPECT_EQ(Shown("fraTeams"), over_teams) << open;
+        EXPECT_EQ(Shown("fraTeams") && Enabled("fraTeams"), false) << open;
+        DoAll({"click cmdHelp1", "click cmdGotoResults"});
+      }
+      EXPECT_TRUE(Shown("fraTeams") && Enabled("fraTeams") && Shown("fraResControls")) << open;
+      Do("click cmdLeaveResults");
+    }
+    EXPECT_GT(stopped, 1);
+  }
+}
+
 class AwayInSetup : public GradeAndDate {
  protected:
   void GoThere() {

@@ -195,6 +195,13 @@ TEST_F(KnockOutSelection, TheWorkFileHoldsTheTableWithItsGap) {
   EXPECT_EQ(File("KO.qz3"), expected + "\"All Association Grades\"\r\n");
 }
 
+TEST_F(KnockOutSelection, ARemovalKeepsTheGrade) {
+  OpenFive();
+  TakeGrade("B Grade");
+  DoAll({"click cmdALL", "dblcell grdKO 1 1", "dblcell grdKO 1 1"});
+  EXPECT_TRUE(File("KO.qz3").ends_with("\"B Grade\"\r\n"));
+}
+
 TEST_F(KnockOutSelection, QuotesAndCommasInNamesComeThroughARemoval) {
   Lay({Player(1, "Smith \"Ace\"", "A, B", "Rovers", "A \"1\", Grade"),
        Player(2, "x\", \"y", "z", "Cubs", "A \"1\", Grade")});

@@ -196,6 +196,37 @@ TEST(LadderRows, PointsThatLeaveSixteenBitsOnTheWayAreAnOverflowThoughTheyComeBa
   EXPECT_EQ(Tallied({"Alpha"}, within, rules)[0].Points, 30000);
 }
 
+TEST(LadderRows, WhateverThePointsAreForTheyAreLookedAtAfterEachMatch) {
+  const std::vector<std::pair<LadderRecord, Integer LadderRules::*>> kinds = {
+      {MatchOn(3, "Alpha", 1, "Gone", 0), &LadderRules::WinPoints},
+      {MatchOn(3, "Alpha", 0, "Gone", 1), &LadderRules::LossPoints},
+      {MatchOn(3, "Alpha", 1, "Gone", 1), &LadderRules::DrawPoints}};
+  for (std::size_t i = 0; i < kinds.size(); ++i) {
+    SCOPED_TRACE(i);
+    LadderRules rules;
+    rules.WinPoints = rules.LossPoints = rules.DrawPoints = 0;
+    rules.*kinds[i].second = -30000;
+    const LadderRecord& other = kinds[(i + 1) % kinds.size()].first;
+    const Matches beyond = {Adjusted(kinds[i].first, -2769, 0), Adjusted(other, 2769, 0)};
+    EXPECT_EQ(ErrorOf([&] { (void)Tallied({"Alpha"}, beyond, rules); }), 6);
+    const Matches within = {Adjusted(kinds[i].first, -2768, 0), Adjusted(other, 2768, 0)};
+    EXPECT_EQ(Tallied({"Alpha"}, within, rules)[0].Points, -30000);
+  }
+}
+
+TEST(LadderRows, AdjustmentsThatLeaveSixteenBitsAreAnOverflowThoughThePointsDoNot) {
+  LadderRules rules;
+  rules.LossPoints = -10000;
+  const LadderRecord loss = MatchOn(3, "Alpha", 0, "Gone", 1);
+  // 32768 given in all, of which 10000 are lost and more will be taken.
+  const Matches beyond = {Adjusted(loss, 20000, 0), Adjusted(loss, 12768, 0),
+                          Adjusted(loss, -20000, 0)};
+  EXPECT_EQ(ErrorOf([&] { (void)Tallied({"Alpha"}, beyond, rules); }), 6);
+  const Matches within = {Adjusted(loss, 20000, 0), Adjusted(loss, 12767, 0),
+                          Adjusted(loss, -20000, 0)};
+  EXPECT_EQ(Tallied({"Alpha"}, within, rules)[0].Points, 12767 - 30000);
+}
+
 TEST(LadderRows, MoreMatchesThanSixteenBitsCountAreAnOverflow) {
   // Against itself a team plays twice. Points for nothing, so that they stay at 0.
   LadderRules rules;

@@ -264,7 +264,9 @@ TEST_F(Report, ATableThatIsTooWideIsToldBeforeTheDocumentIsThrownAway) {
 TEST_F(Report, ABlankPreparesThePrinterAtTheTopOfEachPage) {
   options_.copies = 2;
   Print();
-  for (const Json& page : EventsNamed("printed").at(0)["pages"]) {
+  const Json pages = EventsNamed("printed").at(0)["pages"];
+  ASSERT_EQ(pages.size(), 2U);
+  for (const Json& page : pages) {
     EXPECT_EQ(page[0]["text"], " ");
     EXPECT_EQ(page[0]["y"], 0);
   }

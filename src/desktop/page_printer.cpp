@@ -198,7 +198,9 @@ void PagePrinter::SendToPrinter(const Pages& pages) {
 
 /// The file is there once it is whole.
 void PagePrinter::SendToPdf(const Pages& pages) {
-  const QDir folder(QStandardPaths::writableLocation(QStandardPaths::DocumentsLocation));
+  const QDir folder(pdf_folder_.isEmpty()
+                        ? QStandardPaths::writableLocation(QStandardPaths::DocumentsLocation)
+                        : pdf_folder_);
   folder.mkpath(".");
   const QString stamp = QDateTime::currentDateTime().toString("yyyy-MM-dd HH.mm.ss.zzz");
   const QString path = folder.filePath("Marlowbeck " + stamp + ".pdf");

@@ -30,8 +30,10 @@ struct PrintTarget {
 /// own, and A4 where there is none.
 class PagePrinter : public Printer {
  public:
-  /// `view` is called with the path of each PDF file once it is whole.
-  explicit PagePrinter(std::function<void(const QString& path)> view) : view_(std::move(view)) {}
+  /// `view` is called with the path of each PDF file once it is whole. The files lie in a folder,
+  /// by default among the user's documents.
+  explicit PagePrinter(std::function<void(const QString& path)> view, QString pdf_folder = {})
+      : view_(std::move(view)), pdf_folder_(std::move(pdf_folder)) {}
   std::string DeviceName() override;
   Orientation GetOrientation() override { return orientation_; }
   void SetOrientation(Orientation orientation) override;
@@ -79,6 +81,7 @@ class PagePrinter : public Printer {
   void SendToPreview(const Pages& pages);
 
   std::function<void(const QString&)> view_;
+  QString pdf_folder_;  ///< empty for that of the user's documents
   PrinterFont font_;
   QFont drawn_;
   Orientation orientation_ = Orientation::Portrait;

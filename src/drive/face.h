@@ -92,6 +92,9 @@ class Face {
   /// file cannot be written. `file` is UTF-8.
   virtual std::optional<std::pair<int, int>> Shot(const std::string& file,
                                                   std::optional<std::pair<int, int>> size) = 0;
+  /// The desktop's own printer, which makes a PDF file of each document in a folder, named for the
+  /// screen that prints it; null where there are no windows. `folder` is UTF-8.
+  virtual std::unique_ptr<Printer> MakePdfPrinter(const std::string& folder) = 0;
 };
 
 /// The face on models alone.

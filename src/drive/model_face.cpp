@@ -32,6 +32,9 @@ class ModelFace : public Face {
   }
   std::string FrontScreen() override;
   std::string FocusedControl() override;
+  std::unique_ptr<Printer> MakePdfPrinter(const std::string& /*folder*/) override {
+    return nullptr;
+  }
   std::optional<std::pair<int, int>> Shot(const std::string& /*file*/,
                                           std::optional<std::pair<int, int>> /*size*/) override {
     return std::nullopt;

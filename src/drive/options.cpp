@@ -46,6 +46,7 @@ struct Words {
   std::uint64_t seed = 1;
   int screen_width = 15360;
   bool window = false;
+  std::string pdf_folder;
 };
 
 void Describe(CLI::App& app, Words& words) {
@@ -59,7 +60,10 @@ void Describe(CLI::App& app, Words& words) {
       ->check(CLI::NonNegativeNumber);
   app.add_option("--screen-width", words.screen_width, "the screen's width in twips")
       ->check(CLI::PositiveNumber);
-  app.add_flag("--window", words.window, "work the real windows");
+  auto* const window = app.add_flag("--window", words.window, "work the real windows");
+  app.add_option("--pdf", words.pdf_folder, "make PDF files of documents in this folder")
+      ->needs(window)
+      ->check(CLI::ExistingDirectory);
   app.add_option("FOLDER", words.folder, "the working folder, made if it is missing")->required();
 }
 
@@ -70,6 +74,7 @@ DriveOptions Resolve(const Words& words) {
   options.world.seed = words.seed;
   options.world.screen_width = words.screen_width;
   options.window = words.window;
+  options.world.pdf_folder = words.pdf_folder;
   return options;
 }
 

@@ -7,6 +7,8 @@ World::World(const WorldSettings& settings, const FaceMaker& make_face,
     : clock(settings.today),
       timer_(settings.seed),
       face_(make_face(answers)),
+      pdf_printer_(settings.pdf_folder.empty() ? nullptr
+                                               : face_->MakePdfPrinter(settings.pdf_folder)),
       display_(settings.screen_width, *face_),
       platform_(MakePlatform()) {
   files_.ChangeFolder(settings.folder);
@@ -17,7 +19,8 @@ World::World(const WorldSettings& settings, const FaceMaker& make_face,
 }
 
 Platform World::MakePlatform() {
-  return {face_->GetBoxes(), dialogs_, printer, clipboard, sound_, help_, clock, timer_,
+  Printer& paper = pdf_printer_ ? *pdf_printer_ : printer;
+  return {face_->GetBoxes(), dialogs_, paper, clipboard, sound_, help_, clock, timer_,
           display_,          observer_};
 }
 

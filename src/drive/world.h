@@ -20,6 +20,7 @@ struct WorldSettings {
   Date today;
   std::uint64_t seed = 1;
   int screen_width = 15360;  ///< twips
+  std::string pdf_folder{};  ///< where documents go as PDF files, UTF-8; empty: they are told
 };
 
 using FaceMaker = std::function<std::unique_ptr<Face>(BoxAnswers&)>;
@@ -62,6 +63,7 @@ class World {
   RealFileSystem real_files_;
   FaultFileSystem files_{real_files_};
   std::unique_ptr<Face> face_;
+  std::unique_ptr<Printer> pdf_printer_;  ///< null where documents are told
   ScriptDisplay display_;
   Platform platform_;
   std::unique_ptr<Program> program_;

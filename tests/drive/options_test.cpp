@@ -43,6 +43,16 @@ TEST_F(DriveOptionsRead, TakeWhatIsGiven) {
   EXPECT_TRUE(options->window);
 }
 
+TEST_F(DriveOptionsRead, TakeAFolderForPdfFilesWithWindowsAlone) {
+  const auto options = Read({"--window", "--pdf", scratch.Path().string(), Folder()});
+  ASSERT_TRUE(options);
+  EXPECT_EQ(options->world.pdf_folder, scratch.Path().string());
+  EXPECT_FALSE(Read({"--pdf", scratch.Path().string(), Folder()}));
+  EXPECT_EQ(exit_status, 2);
+  EXPECT_FALSE(Read({"--window", "--pdf", scratch.Path().string() + "/none", Folder()}));
+  EXPECT_EQ(exit_status, 2);
+}
+
 TEST_F(DriveOptionsRead, NameTheFolderInTheProgramsPage) {
   const auto options = Read({scratch.Path().string() + "/M\xC3\xBCller"});
   ASSERT_TRUE(options);

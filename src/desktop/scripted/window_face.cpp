@@ -1,9 +1,13 @@
 #include <stdexcept>
 
 #include <QApplication>
+#include <QDir>
+#include <QFile>
+#include <QFileInfo>
 
 #include "desktop/encoding.h"
 #include "desktop/input_filter.h"
+#include "desktop/page_printer.h"
 #include "desktop/scripted/gestures.h"
 #include "desktop/scripted/scripted_boxes.h"
 #include "desktop/scripted/window_hand.h"
@@ -40,8 +44,11 @@ class WindowFace : public Face {
   std::string FocusedControl() override;
   std::optional<std::pair<int, int>> Shot(const std::string& file,
                                           std::optional<std::pair<int, int>> size) override;
+  std::unique_ptr<Printer> MakePdfPrinter(const std::string& folder) override;
 
  private:
+  void NameForScreen(const QString& pdf_file);
+
   ScriptedBoxes boxes_;
   std::unique_ptr<Windows> windows_;
   std::unique_ptr<InputFilter> filter_;
@@ -89,6 +96,20 @@ std::string WindowFace::FocusedControl() {
   const View* const view = focus == nullptr ? nullptr : front->ViewAt(focus);
   if (view == nullptr || !focus->isVisible() || !focus->isEnabled()) return {};
   return front->GetScreen().Name() + "." + view->GetControl().Name();
+}
+
+std::unique_ptr<Printer> WindowFace::MakePdfPrinter(const std::string& folder) {
+  const QString path = QString::fromStdString(folder);
+  return std::make_unique<PagePrinter>([this](const QString& file) { NameForScreen(file); }, path);
+}
+
+/// "frmLadder.pdf", and for its next document "frmLadder-2.pdf".
+void WindowFace::NameForScreen(const QString& pdf_file) {
+  const QDir folder = QFileInfo(pdf_file).dir();
+  const QString screen = QString::fromStdString(FrontScreen());
+  QString name = screen + ".pdf";
+  for (int n = 2; folder.exists(name); ++n) name = screen + '-' + QString::number(n) + ".pdf";
+  QFile::rename(pdf_file, folder.filePath(name));
 }
 
 std::optional<std::pair<int, int>> WindowFace::Shot(const std::string& file,

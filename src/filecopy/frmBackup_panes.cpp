@@ -1,5 +1,7 @@
 // The two panes of the file copier: where they stand, and which of their files are selected.
 
+#include <algorithm>
+
 #include "data/runtime_error.h"
 #include "filecopy/copy_words.h"
 #include "filecopy/frmBackup.h"
@@ -17,10 +19,27 @@ void Say(Label& label, std::string_view words, Meaning meaning) {
   label.SetMeaning(meaning);
 }
 
+/// Those that have come since stand below the others, and those that have gone keep their lines, so
+/// that none moves away under the pointer that is about to pick it.
+void TakeNewDrives(DriveList& list, FileSystem& files) {
+  for (const std::string& drive : files.Drives()) {
+    if (list.Find(drive) < 0) list.AddLine(drive);
+  }
+}
+
+/// Throws DeviceUnavailable for a drive that has gone, though the folder where it stood may be
+/// left.
+void ExpectReady(FileSystem& files, const std::string& drive) {
+  const std::vector<std::string> drives = files.Drives();
+  if (std::find(drives.begin(), drives.end(), drive) == drives.end()) {
+    throw RunTimeError(ErrorNumber::DeviceUnavailable);
+  }
+}
+
 }  // namespace
 
 void frmBackup::Connect(CopyPane& pane, CopyPane& other) {
-  pane.BuDrive.GotFocus = [&pane] { pane.BuDrive.Refresh(); };
+  pane.BuDrive.GotFocus = [this, &pane] { TakeNewDrives(pane.BuDrive, context_.channels.Files()); };
   pane.BuDrive.Change = [this, &pane] { DriveChanged(pane); };
   pane.BuDir.Change = [this, &pane] { FolderChanged(pane); };
   pane.BuDir.GotFocus = [this, &other] { FocusTaken(other); };
@@ -51,6 +70,7 @@ void frmBackup::DriveChanged(CopyPane& pane) {
   const std::string drive = pane.BuDrive.Drive();
   const std::string before = pane.Path();
   try {
+    ExpectReady(context_.channels.Files(), drive);
     pane.BuDir.SetPath(drive);
   } catch (const RunTimeError&) {
     Warning(context_, "Drive " + drive + " is not available!    ");

@@ -120,6 +120,34 @@ TEST_F(RealMedia, ADriveThatIsNotReadyIsWarnedOfAndTheLastGoodOneComesBack) {
   EXPECT_EQ(club.Caption("lblPathD"), "/");
 }
 
+TEST_F(RealMedia, ADriveThatWentBehindTheListIsWarnedOfAtTheFirstClick) {
+  club.DoAll({"pick BuDriveD =/", "focus BuDirS"});
+  const std::string gone = disk.Path();
+  disk.Go();
+  club.Do("pick BuDriveD =" + gone);
+  EXPECT_EQ(club.BoxTexts(), Names{"Drive " + gone + " is not available!    "});
+  EXPECT_EQ(club.Lines("BuDriveD").at(static_cast<std::size_t>(club.Index("BuDriveD"))), "/");
+  EXPECT_EQ(club.Caption("lblPathD"), "/");
+}
+
+TEST_F(RealMedia, ADriveWhoseFolderIsLeftIsNotReadyEither) {
+  club.DoAll({"pick BuDriveD =/", "focus BuDriveD"});
+  disk.Unmount();
+  club.Do("pick BuDriveD =" + disk.Path());
+  EXPECT_EQ(club.BoxTexts(), Names{"Drive " + disk.Path() + " is not available!    "});
+  EXPECT_EQ(club.Caption("lblPathD"), "/");
+}
+
+TEST_F(RealMedia, NoDriveComesToStandInTheLineOfAnother) {
+  club.DoAll({"pick BuDriveD =/", "focus BuDirS"});
+  Names drives = club.Lines("BuDriveD");
+  const SmallDisk other;
+  disk.Unmount();
+  club.Do("focus BuDriveD");
+  drives.push_back(other.Path());
+  EXPECT_EQ(club.Lines("BuDriveD"), drives);
+}
+
 TEST_F(RealMedia, AnotherMountOfTheSameFolderIsTheSameFolder) {
   const TemporaryFolder twin;
   if (mount(disk.Path().c_str(), twin.Path().c_str(), nullptr, MS_BIND, nullptr) != 0) {

@@ -151,9 +151,16 @@ TEST_F(KnockOutPrinting, SevenPrintEightRowsWithTheByeInTheLast) {
   EXPECT_EQ((TextList{words.end() - 5, words.end()}),
             (TextList{"7", "P7, X", "A Grade", "8", "--- bye ---"}));
   EXPECT_EQ(Players().size(), 7U);
-  // The words of the bye have room in their column, though they are the longest of all.
-  const PrintedText bye = page.Find("--- bye ---");
-  EXPECT_LE(bye.x + 1100, page.lines[page.lines.size() - 1].x1);
+}
+
+TEST_F(KnockOutPrinting, TheByeTakesNoPartInTheMeasuring) {
+  // # 480, players 8 letters and 240, grades 7 letters and 240, as without a bye.
+  Lay(FivePlayers());
+  OpenSelection();
+  Select({"Dean, Di : B Grade"});
+  DoAll({"answer yes", "click cmdPrnt"});
+  const PrintedPage page = Print().at(0);
+  EXPECT_NEAR(page.boxes[0].x2 - page.boxes[0].x1, 480 + 1040 + 940, 0.01);
 }
 
 TEST_F(KnockOutPrinting, EveryCopyHasTheBye) {

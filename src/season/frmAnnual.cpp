@@ -38,6 +38,7 @@ void frmAnnual::Load() {
   font_box_.GetFont();
   ReadFileName(context_);
   GetGrades();
+  OfferAll();
 }
 
 /// The date in hand is kept on disk alone from here on.

@@ -2,6 +2,7 @@
 
 #include "data/competition.h"
 #include "data/date.h"
+#include "data/runtime_error.h"
 #include "data/text.h"
 #include "print/tabbed_text.h"
 #include "session/messages.h"
@@ -68,19 +69,25 @@ void frmPegRatio::OfferCopies(bool offered) {
 
 void frmPegRatio::ReCalc() {
   fraGrid.Hide();
+  // What is not worked out to its end is neither printed nor copied.
+  OfferCopies(false);
   session_.Grade = Trim(cboResGrade.Text());
   NameGradeFiles(session_);
-  const bool any = AnyPegs();
-  OfferCopies(any);
-  if (!any) {
+  if (!AnyPegs()) {
     Warning(context_, "No pegs found for " + session_.Grade + ".   ");
     return;
   }
   GetSeason();
-  CalcRatio();
+  try {
+    CalcRatio();
+  } catch (const RunTimeError&) {
+    pbRatio.Hide();
+    throw;
+  }
   GridRatio();
   lblHi0.SetCaption(session_.Grade + "   Player Peg Ratios");
   lblHi1.SetCaption(session_.SeasonDescription);
+  OfferCopies(true);
   fraGrid.Show();
 }
 

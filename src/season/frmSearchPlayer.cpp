@@ -60,6 +60,8 @@ void frmSearchPlayer::ShowFound() {
 void frmSearchPlayer::GetPlayers() {
   session_.RowCount = 0;
   OpenFile(session_, context_.channels);
+  // Without an open competition there is nobody to be found.
+  if (session_.PlayerFile.empty()) return TellCount();
   context_.channels.ForEachRecord(Channel::Players, [&](Bytes record, int) {
     if (UpperCase(PlayerView(record).Surname()).find(session_.SearchText) == std::string::npos) {
       return;

@@ -155,6 +155,21 @@ TEST_F(PegRatioScreen, PegsOfPlayersThatAreGoneMakeNoList) {
   EXPECT_EQ(Cells("grdRatio").size(), 2U);
 }
 
+TEST_F(PegRatioScreen, AListThatCannotBeWrittenIsNotOffered) {
+  OpenList();
+  Do("fault write 1 61");
+  Do("pick cboResGrade =A Grade");
+  EXPECT_EQ(EventsNamed("error").at(0)["number"], 61);
+  for (const char* control : {"fraGrid", "pbRatio"}) EXPECT_FALSE(Shown(control)) << control;
+  for (const char* control : {"cmdHiPrint", "cmdClipRatio"}) {
+    EXPECT_FALSE(Enabled(control)) << control;
+  }
+  Do("fault off");
+  Do("pick cboResGrade =A Grade");
+  EXPECT_TRUE(Shown("fraGrid"));
+  EXPECT_TRUE(Enabled("cmdHiPrint"));
+}
+
 TEST_F(PegRatioScreen, AMissingTitleIsAskedFor) {
   DeleteFile("Winter_A Grade.qzs");
   Open();

@@ -85,6 +85,18 @@ TEST_F(SearchPlayer, NothingFoundHidesGridAndCopy) {
   EXPECT_EQ(Caption("lblInfo"), "Name/s containing ZZ not found !");
 }
 
+TEST_F(SearchPlayer, WithoutAnOpenFileNobodyIsFound) {
+  Do("click mnuClose");
+  Search("mc");
+  EXPECT_TRUE(EventsNamed("error").empty());
+  EXPECT_TRUE(Boxes().empty());
+  EXPECT_EQ(Caption("lblInfo"), "Name/s containing MC not found !");
+  EXPECT_FALSE(Shown("grdShow"));
+  EXPECT_FALSE(Shown("cmdClip"));
+  Do("click cmdExit");
+  EXPECT_EQ(Front(), "frmDB");
+}
+
 TEST_F(SearchPlayer, SearchAgainShowsTheGridAgain) {
   Search("zz");
   Do("input tom");

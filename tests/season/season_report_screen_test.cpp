@@ -70,6 +70,7 @@ TEST_F(SeasonReport, OpensWithTheFirstGradeAndTeam) {
   EXPECT_FALSE(Enabled("cmdPrinter"));
   EXPECT_FALSE(Enabled("cmdClipAnnual"));
   EXPECT_FALSE(Shown("picPrinter"));
+  EXPECT_EQ(Caption("lblAllAnnual"), "Print ALL 0 Players.");
 }
 
 TEST_F(SeasonReport, ATeamWithoutResultsListsNobodyAndSaysSo) {

@@ -86,8 +86,8 @@ void frmPMenu::ListGrades() {
   // KEPT: here too the season's title stays that of the first grade when another one is picked, on
   // the screen and in a copy for a spreadsheet; a repair would read the title of each grade here.
   NameGradeFiles(session_);
-  lstHiDates.Clear();
   GetHiDates();
+  lstHiDates.Clear();
   std::vector<std::string> lines;
   for (const Date date : session_.TeamDates) lines.push_back(ShortDate(date));
   for (const std::string& line : lines) lstHiDates.AddLine(line);

@@ -67,6 +67,8 @@ void frmPMenu::CloseListPrintPanel() {
 }
 
 void frmPMenu::PrintHI() {
+  // The way back from all grades stays open behind the panel, and can lead to an empty list.
+  if (ListedRows() == 0) return;
   const int amount = std::min<int>(Integer::Narrow(Val(txtHI.Text())), grdHI.Rows() - 1);
   PrintList(context_, list_print_panel_.Chosen(),
             PrintedList(grdHI, amount, lblHi[0].Caption(), lblHi[1].Caption()));

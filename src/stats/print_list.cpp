@@ -2,6 +2,7 @@
 
 #include "data/text.h"
 #include "print/paged_rows.h"
+#include "session/season.h"
 
 namespace marlowbeck {
 namespace {
@@ -21,9 +22,12 @@ class ListPrint {
   ListPrint(const Context& context, PrintJob& job, const ListOnPaper& list)
       : context_(context), job_(job), page_(job.OnPage()), list_(list) {}
 
+  /// A list that is too wide is refused before anything is asked about its title.
   void Print() {
+    page_.SetFont();
     const TableLayout layout = Measured();
     if (!job_.FitsAcross(layout.Width())) return;
+    GetSeason(context_);
     job_.PrintCopies([&] { return Compose(layout); });
   }
 
@@ -85,9 +89,7 @@ ListOnPaper PrintedList(const Grid& grid, int amount, const std::string& title,
 }
 
 void PrintList(const Context& context, const PrintOptions& options, const ListOnPaper& list) {
-  PrintJob::Run(context, options, [&](PrintJob& job) {
-    if (job.Begin()) ListPrint(context, job, list).Print();
-  });
+  PrintJob::Run(context, options, [&](PrintJob& job) { ListPrint(context, job, list).Print(); });
 }
 
 }  // namespace marlowbeck

@@ -245,12 +245,33 @@ TEST_F(ListPrinting, AllGradesTogetherHaveTheGradeInTheMeasuredColumn) {
   EXPECT_NEAR(pages[0].boxes[0].x2 - pages[0].boxes[0].x1, 2 * 480 + 1240 + 840 + 2 * 340, 0.01);
 }
 
+TEST_F(ListPrinting, AListThatHasGoneBehindThePanelPrintsNothing) {
+  LayClub();
+  WriteResults("Winter_A.qzr", {Night(1, "Rovers", "Hawks", kFirstNight, 500, 20),
+                                ForfeitNight(1, "Rovers", "Hawks", kSecondNight)});
+  OpenList();
+  DoAll({"pick lstHiDates 0", "click cmdCombine", "click cmdHiPrint", "click cmdReDoAvgs"});
+  EXPECT_FALSE(Shown("fraHi"));
+  Do("click cmdBothOKHI");
+  EXPECT_EQ(Count("printed") + Count("killed"), 0);
+  ExpectOpen(false);
+}
+
 TEST_F(ListPrinting, TheSeasonsTitleIsReadAgain) {
   OpenPanel();
   WriteFile("Winter_A.qzs", "\"Autumn 2004\"\r\n");
   const auto pages = Print();
   ASSERT_EQ(pages.size(), 1U);
   EXPECT_EQ(pages[0].Words()[1], "Autumn 2004");
+}
+
+TEST_F(ListPrinting, AListThatIsTooWideIsRefusedBeforeItsSeasonIsAskedFor) {
+  OpenPanel();
+  DeleteFile("Winter_A.qzs");
+  DoAll({"printer width 3599", "click cmdBothOKHI"});
+  EXPECT_EQ(Count("input"), 0);
+  EXPECT_EQ(BoxTexts(), (TextList{"Font is too large, please re-select.    "}));
+  EXPECT_EQ(Count("killed"), 1);
 }
 
 TEST_F(ListPrinting, EachCopyIsAPageOfItsOwn) {

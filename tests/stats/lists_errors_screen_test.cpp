@@ -31,6 +31,17 @@ TEST_F(ListErrors, ADateThatCannotBeShownEndsInTheErrorBoxAndTheNextGradeWorks) 
   EXPECT_EQ(Ranked(), (TextList{"Dean, Di 20.00"}));
 }
 
+TEST_F(ListErrors, DatesThatCannotBeReadLeaveThoseThatStandAndTheNextPickWorks) {
+  LayClub();
+  OpenList();
+  DoAll({"click cmdCombine", "fault open 1 57", "click cmdReDoAvgs"});
+  EXPECT_EQ(Errors(), (std::vector<int>{57}));
+  EXPECT_EQ(Lines("lstHiDates"), (TextList{"17/03/2004", "24/03/2004"}));
+  DoAll({"fault off", "pick lstHiDates 1"});
+  EXPECT_TRUE(Errors().empty());
+  EXPECT_EQ(Ranked(), (TextList{"Clark, Ed 30.00", "Archer, Jo 25.25"}));
+}
+
 TEST_F(ListErrors, OverAThousandResultsOfADateAreASubscriptFailureAndTheNextDateWorks) {
   HOLDS_FOR_MODELS_ALONE("a thousand rows take long to be read back from windows");
   LayClub();

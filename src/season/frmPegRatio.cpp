@@ -172,6 +172,7 @@ void frmPegRatio::cmdClipRatio_Click() {
   text.Line("Print Date:  " + ShortDate(context_.platform.clock.Today()));
   for (int row = 0; row < grdRatio.Rows(); ++row) {
     std::vector<std::string> cells;
+    cells.reserve(kColumns);
     for (int col = 0; col < kColumns; ++col) cells.push_back(grdRatio.Cell(row, col));
     text.Row(cells, TabbedText::LastTab::Yes);
   }

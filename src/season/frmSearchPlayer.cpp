@@ -102,6 +102,7 @@ void frmSearchPlayer::cmdClip_Click() {
   TabbedText text;
   for (int row = 0; row < grdShow.Rows(); ++row) {
     std::vector<std::string> cells;
+    cells.reserve(kColumns);
     for (int column = 0; column < kColumns; ++column) {
       cells.push_back(Trim(grdShow.Cell(row, column)));
     }

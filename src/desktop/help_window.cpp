@@ -13,7 +13,7 @@ namespace marlowbeck {
 namespace {
 
 constexpr const char* kContents = "index.md";
-constexpr int kMargin = 24;
+constexpr int kPageMargin = 24;
 
 /// How a heading is called in a link: lower case, words joined by hyphens.
 QString AnchorOf(const QString& heading) {
@@ -69,7 +69,7 @@ void HelpWindow::MakeBrowser() {
   browser_ = new Pages;
   browser_->setWindowTitle("Marlowbeck Help");
   browser_->setSearchPaths({folder_});
-  browser_->document()->setDocumentMargin(kMargin);
+  browser_->document()->setDocumentMargin(kPageMargin);
   browser_->setOpenExternalLinks(true);
   browser_->resize(720, 560);
 }

@@ -26,9 +26,8 @@ namespace marlowbeck {
 namespace {
 
 constexpr int kTwipsPerInch = 1440;
-constexpr int kTwipsPerPoint = 20;
-constexpr double kMargin = 18;  ///< that no printer prints on, in points
-constexpr double kRule = 10;    ///< width of lines, in twips
+constexpr double kUnprinted = 18;  ///< that no printer prints on, in points
+constexpr double kRule = 10;       ///< width of lines, in twips
 
 }  // namespace
 
@@ -95,7 +94,7 @@ QPageLayout PagePrinter::FindLayout() {
     printer.setPageOrientation(way);
     if (printer.isValid()) return printer.pageLayout();
   }
-  return {QPageSize(QPageSize::A4), way, QMarginsF(kMargin, kMargin, kMargin, kMargin)};
+  return {QPageSize(QPageSize::A4), way, QMarginsF(kUnprinted, kUnprinted, kUnprinted, kUnprinted)};
 }
 
 int PagePrinter::PageWidth() {

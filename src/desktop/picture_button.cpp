@@ -5,7 +5,7 @@
 namespace marlowbeck {
 namespace {
 
-constexpr int kMargin = 6;  ///< room for the frame, in pixels
+constexpr int kFrame = 6;  ///< room for the frame, in pixels
 constexpr double kFrameWidth = 3;
 constexpr double kRadius = 8;
 constexpr double kFaded = 0.35;
@@ -33,13 +33,13 @@ void PictureButton::SetBordered(bool bordered) {
 }
 
 QSize PictureButton::sizeHint() const {
-  return picture_.defaultSize() + QSize(2 * kMargin, 2 * kMargin);
+  return picture_.defaultSize() + QSize(2 * kFrame, 2 * kFrame);
 }
 
 QSize PictureButton::minimumSizeHint() const { return sizeHint() / 2; }
 
 QRectF PictureButton::PictureArea() const {
-  const QRectF room = QRectF(rect()).adjusted(kMargin, kMargin, -kMargin, -kMargin);
+  const QRectF room = QRectF(rect()).adjusted(kFrame, kFrame, -kFrame, -kFrame);
   QSizeF size = picture_.defaultSize();
   size.scale(room.size(), Qt::KeepAspectRatio);
   QRectF area(QPointF(0, 0), size);
@@ -83,7 +83,7 @@ void PictureButton::PaintFrame(QPainter& painter) const {
   painter.setPen(bordered_ ? QPen(color, kFrameWidth) : QPen(color, 2, Qt::DashLine));
   const double inset = kFrameWidth / 2;
   painter.drawRoundedRect(PictureArea()
-                              .adjusted(-kMargin, -kMargin, kMargin, kMargin)
+                              .adjusted(-kFrame, -kFrame, kFrame, kFrame)
                               .adjusted(inset, inset, -inset, -inset),
                           kRadius, kRadius);
 }

@@ -9,8 +9,6 @@
 namespace marlowbeck {
 namespace {
 
-constexpr int kTwipsPerPoint = 20;
-
 /// What stands behind a font is of its kind: columns of characters stay columns.
 QStringList FamiliesFor(const PrinterFont& font) {
   const QString name = ToQt(font.name);

@@ -9,6 +9,8 @@
 
 namespace marlowbeck {
 
+inline constexpr int kTwipsPerPoint = 20;
+
 // The printer's font as it is drawn. What a machine has not is drawn in the plain face that every
 // system gets; "MS Sans Serif", which only one system has, in one of like widths.
 

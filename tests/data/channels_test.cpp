@@ -9,12 +9,11 @@
 #include "data/fault_file_system.h"
 #include "data/real_file_system.h"
 #include "tests/data/expect_error.h"
+#include "tests/data/killed.h"
 #include "tests/data/temporary_folder.h"
 
 namespace marlowbeck {
 namespace {
-
-struct Killed {};
 
 constexpr std::size_t kLength = 4;
 

@@ -7,13 +7,11 @@
 
 #include "data/real_file_system.h"
 #include "tests/data/expect_error.h"
+#include "tests/data/killed.h"
 #include "tests/data/temporary_folder.h"
 
 namespace marlowbeck {
 namespace {
-
-/// Stands for the end of the process.
-struct Killed {};
 
 class Faults : public testing::Test {
  protected:

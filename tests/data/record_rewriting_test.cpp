@@ -9,15 +9,14 @@
 #include "data/fault_file_system.h"
 #include "data/real_file_system.h"
 #include "tests/data/expect_error.h"
+#include "tests/data/killed.h"
 #include "tests/data/temporary_folder.h"
 
 namespace marlowbeck {
 namespace {
 
-constexpr std::size_t kLength = 4;
+constexpr std::size_t kFourLetters = 4;
 constexpr int kDiskFull = 61;
-
-struct Killed {};
 
 /// Files of records of four letters each.
 class RecordRewritingTest : public testing::Test {
@@ -78,7 +77,7 @@ class RecordRewritingTest : public testing::Test {
 class RecordRemovalTest : public RecordRewritingTest {
  protected:
   void Remove(const std::string& name = "r") {
-    channels.OpenRandom(Channel::Results, name, kLength);
+    channels.OpenRandom(Channel::Results, name, kFourLetters);
     RemoveRecords(channels, Channel::Results,
                   [](Bytes record, int) { return ReadText(record, 0, 1) == "x"; });
   }
@@ -105,7 +104,7 @@ TEST_F(RecordRemovalTest, BytesBehindTheLastWholeRecordGo) {
 
 TEST_F(RecordRemovalTest, RecordsAreNumberedFromOne) {
   folder.Write("r", "aaaabbbbcccc");
-  channels.OpenRandom(Channel::Players, "r", kLength);
+  channels.OpenRandom(Channel::Players, "r", kFourLetters);
   RemoveRecords(channels, Channel::Players, [](Bytes, int number) { return number == 2; });
   EXPECT_EQ(folder.Read("r"), "aaaacccc");
 }
@@ -113,7 +112,7 @@ TEST_F(RecordRemovalTest, RecordsAreNumberedFromOne) {
 TEST_F(RecordRemovalTest, AllChannelsAreClosed) {
   folder.Write("r", "aaaa");
   folder.Write("p", "pppp");
-  channels.OpenRandom(Channel::Players, "p", kLength);
+  channels.OpenRandom(Channel::Players, "p", kFourLetters);
   Remove();
   EXPECT_ERROR(52, (void)channels.RecordCount(Channel::Players));
   EXPECT_ERROR(52, (void)channels.RecordCount(Channel::Results));
@@ -161,7 +160,8 @@ TEST_F(RecordRemovalTest, AKillAnywhereLeavesTheOldFileOrTheNewOne) {
 /// A copy to a work file of a name of its own, without one record.
 class RecordCopyTest : public RecordRewritingTest {
  protected:
-  std::string CopyWithout(const std::string& content, int doomed, std::size_t length = kLength) {
+  std::string CopyWithout(const std::string& content, int doomed,
+                          std::size_t length = kFourLetters) {
     folder.Write("r", content);
     channels.OpenRandom(Channel::Results, "r", length);
     CopyRecordsWithout(
@@ -174,7 +174,7 @@ TEST_F(RecordCopyTest, LeavesOutEveryRecordInTurn) {
   const std::string records = "aaaabbbbccccddddeeee";
   for (int number = 1; number <= 5; ++number) {
     std::string others = records;
-    others.erase((static_cast<std::size_t>(number) - 1) * kLength, kLength);
+    others.erase((static_cast<std::size_t>(number) - 1) * kFourLetters, kFourLetters);
     folder.Write("copy", "");
     EXPECT_EQ(CopyWithout(records, number), others) << number;
   }
@@ -212,10 +212,10 @@ TEST_F(RecordCopyTest, WorksAtTheLimitOf32767Records) {
 class RecordChangeTest : public RecordRewritingTest {
  protected:
   void ChangeThem() {
-    channels.OpenRandom(Channel::Results, "r", kLength);
+    channels.OpenRandom(Channel::Results, "r", kFourLetters);
     ChangeRecords(channels, Channel::Results, [](std::span<std::byte> record) {
       if (ReadText(record, 0, 1) != "x") return false;
-      WriteText(record, {"", 0, kLength, FieldKind::Text}, "yyyyy");
+      WriteText(record, {"", 0, kFourLetters, FieldKind::Text}, "yyyyy");
       return true;
     });
   }

@@ -8,8 +8,8 @@ namespace {
 
 constexpr const char* kLadderFile = "Winter_A Grade.qzl";
 
-LadderRecord Match(int day, std::string_view home, int home_score, std::string_view away,
-                   int away_score, int away_penalty = 0) {
+LadderRecord Played(int day, std::string_view home, int home_score, std::string_view away,
+                    int away_score, int away_penalty = 0) {
   LadderRecord match;
   match.HomeTeam = home;
   match.AwayTeam = away;
@@ -31,10 +31,10 @@ class LadderPrinting : public ClubTest {
     WritePlayers("Winter.qza", players);
     WriteFile(kLadderFile,
               FileOf(std::vector<LadderRecord>{
-                  Match(3, "Alpha", 7, "Bravo", 4), Match(3, "Charlie", 5, "Delta", 5),
-                  Match(10, "Bravo", 6, "Charlie", 5), Match(10, "Delta", 8, "Alpha", 3),
-                  Match(17, "Alpha", 6, "Charlie", 5),
-                  Match(17, "Delta", 4, "Bravo", 7, bravos_penalty)}));
+                  Played(3, "Alpha", 7, "Bravo", 4), Played(3, "Charlie", 5, "Delta", 5),
+                  Played(10, "Bravo", 6, "Charlie", 5), Played(10, "Delta", 8, "Alpha", 3),
+                  Played(17, "Alpha", 6, "Charlie", 5),
+                  Played(17, "Delta", 4, "Bravo", 7, bravos_penalty)}));
     WriteFile("Winter_A Grade.qzi", " 2  0  1  4  11 \r\n");
     WriteFile("Winter_A Grade.qzs", "\"Winter 2004\"\r\n");
     WriteFile("Association.qz3", "\"Marlow Darts\"\r\n");
@@ -314,7 +314,7 @@ TEST_F(LadderPrinting, ATableThatCouldNotBeWorkedOutIsNotPrintedFromTheDateBefor
   // The last night takes Alpha's games past what can be counted.
   std::string file = File(kLadderFile);
   WriteFile(kLadderFile,
-            file + FileOf(std::vector<LadderRecord>{Match(24, "Alpha", 320, "Bravo", 1)}));
+            file + FileOf(std::vector<LadderRecord>{Played(24, "Alpha", 320, "Bravo", 1)}));
   OpenTab();
   DoAll({"pick lstTableDates 0", "pick lstTableDates 3"});
   ASSERT_EQ(EventsNamed("error").size(), 1U);

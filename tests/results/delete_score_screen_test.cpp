@@ -7,7 +7,6 @@ namespace marlowbeck {
 namespace {
 
 constexpr const char* kWorkFile = "Winter_A Grade.qz3";
-constexpr const char* kLadder = "Winter_A Grade.qzl";
 
 class DeleteScore : public ScoreSheets {
  protected:
@@ -117,12 +116,12 @@ TEST_F(DeleteScore, TheFirstAndTheLastRecordOfTheFileGoAsAnyOther) {
 }
 
 TEST_F(DeleteScore, NoOtherFileChanges) {
-  WriteFile(kLadder, std::string(160, '\x01'));
+  WriteFile(kALadder, std::string(160, '\x01'));
   WriteResults(kBResults, {Night(41, "Bees", "Crows")});
   Open(four);
   Delete();
   EXPECT_EQ(File(kLeagueFile), FileOf(LeaguePlayers()));
-  EXPECT_EQ(File(kLadder), std::string(160, '\x01'));
+  EXPECT_EQ(File(kALadder), std::string(160, '\x01'));
   EXPECT_EQ(File(kBResults), FileOf(std::vector{Night(41, "Bees", "Crows")}));
   EXPECT_EQ(File("WkDate.qz3"), "#2004-03-31#\r\n");
 }

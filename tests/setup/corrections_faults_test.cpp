@@ -7,9 +7,6 @@
 namespace marlowbeck {
 namespace {
 
-constexpr const char* kResults = "Winter_A Grade.qzr";
-constexpr const char* kLadder = "Winter_A Grade.qzl";
-
 /// The bytes of a competition's three files of records.
 struct Files {
   std::string players;
@@ -28,8 +25,8 @@ Files Before() {
 
 void Lay(Club& club) {
   club.WriteFile(kPlayerFile, Before().players);
-  club.WriteFile(kResults, Before().results);
-  club.WriteFile(kLadder, Before().ladder);
+  club.WriteFile(kAResults, Before().results);
+  club.WriteFile(kALadder, Before().ladder);
   club.WriteFile("Winter_A Grade.qzi", "3\r\n0\r\n1\r\n4\r\n11\r\n");
   club.WriteFile("Winter_A Grade.qzs", "\"Winter\"\r\n");
   club.NameOpenFile(kPlayerFile);
@@ -79,7 +76,7 @@ TEST(CorrectionFaults, AnEditedPlayer) {
                      edit(club);
                      club.Do("click cmdAddSave");
                      EXPECT_TRUE(SamePlayers(club.File(kPlayerFile), FileOf(after)));
-                     EXPECT_EQ(club.File(kResults), Before().results);
+                     EXPECT_EQ(club.File(kAResults), Before().results);
                    }});
 }
 
@@ -98,7 +95,7 @@ TEST(CorrectionFaults, TheTakingUpOfAPlayer) {
                    lines,
                    [&](Club& club) {
                      IsNew(club.File(kPlayerFile), Before().players, FileOf(after));
-                     EXPECT_EQ(club.File(kResults), Before().results);
+                     EXPECT_EQ(club.File(kAResults), Before().results);
                    }});
 }
 
@@ -164,14 +161,14 @@ TEST(CorrectionFaults, ARenamedTeam) {
        [&](Club& club) {
          const Files before = Before();
          const bool players = IsNew(club.File(kPlayerFile), before.players, after.players);
-         ExpectInOrder({players, IsNew(club.File(kResults), before.results, after.results),
-                        IsNew(club.File(kLadder), before.ladder, after.ladder)});
+         ExpectInOrder({players, IsNew(club.File(kAResults), before.results, after.results),
+                        IsNew(club.File(kALadder), before.ladder, after.ladder)});
          // A team that was left half renamed is named back, and then goes through.
          if (players) rename(club, "Rangers", "Rovers");
          rename(club, "Rovers", "Rangers");
          EXPECT_TRUE(SamePlayers(club.File(kPlayerFile), after.players));
-         EXPECT_TRUE(SameResults(club.File(kResults), after.results));
-         EXPECT_TRUE(SameMatches(club.File(kLadder), after.ladder));
+         EXPECT_TRUE(SameResults(club.File(kAResults), after.results));
+         EXPECT_TRUE(SameMatches(club.File(kALadder), after.ladder));
        }});
 }
 
@@ -189,12 +186,12 @@ TEST(CorrectionFaults, ADeletedPlayerWithResults) {
        [&](Club& club) {
          const Files before = Before();
          const bool gone = IsNew(club.File(kPlayerFile), before.players, after.players);
-         ExpectInOrder({IsNew(club.File(kResults), before.results, after.results), gone});
-         EXPECT_EQ(club.File(kLadder), before.ladder);
+         ExpectInOrder({IsNew(club.File(kAResults), before.results, after.results), gone});
+         EXPECT_EQ(club.File(kALadder), before.ladder);
          OpenTeam(club, "Rovers");
          if (!gone) club.DoAll({"pick lstPlayers 1", "answer ok", "click cmdDelName"});
          EXPECT_TRUE(SamePlayers(club.File(kPlayerFile), after.players));
-         EXPECT_TRUE(SameResults(club.File(kResults), after.results));
+         EXPECT_TRUE(SameResults(club.File(kAResults), after.results));
          EXPECT_FALSE(club.HasFile("TEMP.RES"));
        }});
 }
@@ -210,7 +207,7 @@ TEST(CorrectionFaults, ADeletedPlayerWithoutResults) {
                    {"click cmdDelName"},
                    [&](Club& club) {
                      IsNew(club.File(kPlayerFile), Before().players, after.players);
-                     EXPECT_EQ(club.File(kResults), Before().results);
+                     EXPECT_EQ(club.File(kAResults), Before().results);
                      club.Try("close frmNames");
                      club.DoAll({"click imgPlayers", "click cmdAddCancel"});
                      EXPECT_EQ(club.Front(), "frmDB");

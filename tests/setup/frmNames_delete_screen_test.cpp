@@ -3,8 +3,7 @@
 namespace marlowbeck {
 namespace {
 
-constexpr const char* kResults = "Winter_A Grade.qzr";
-constexpr const char* kWorkFile = "TEMP.RES";
+constexpr const char* kLeftResults = "TEMP.RES";
 
 const std::string kAbout =
     "You are about to permanently erase the following player from your file.    \r\r";
@@ -40,8 +39,8 @@ TEST_F(DeletePlayerTest, APlayerWithoutResultsGoesAfterAQuestion) {
   std::vector<PlayerRecord> players = TwoGrades();
   players.erase(players.begin() + 1);
   EXPECT_TRUE(SamePlayers(File(kPlayerFile), FileOf(players)));
-  EXPECT_EQ(File(kResults), "");
-  EXPECT_FALSE(HasFile(kWorkFile));
+  EXPECT_EQ(File(kAResults), "");
+  EXPECT_FALSE(HasFile(kLeftResults));
 }
 
 TEST_F(DeletePlayerTest, ThenTheScreenIsAsAtItsStart) {
@@ -64,7 +63,7 @@ TEST_F(DeletePlayerTest, ThenTheScreenIsAsAtItsStart) {
 }
 
 TEST_F(DeletePlayerTest, ThePlayersResultsGoToo) {
-  WriteResults(kResults, SomeResults());
+  WriteResults(kAResults, SomeResults());
   WriteResults("Winter_B Grade.qzr", {Night(2, "Rovers", "Hawks")});
   OpenSetup(TwoGrades());
   Delete("Rovers", "Baker, Al");
@@ -74,14 +73,14 @@ TEST_F(DeletePlayerTest, ThePlayersResultsGoToo) {
   EXPECT_EQ(Boxes()[0].style, 17);
   const std::vector<ResultRecord> all = SomeResults();
   EXPECT_TRUE(
-      SameResults(File(kResults), FileOf(std::vector<ResultRecord>{all[1], all[2], all[4]})));
+      SameResults(File(kAResults), FileOf(std::vector<ResultRecord>{all[1], all[2], all[4]})));
   EXPECT_EQ(Saved().size(), 3U);
   EXPECT_EQ(Results("Winter_B Grade.qzr").size(), 1U);  // no more than the grade's file
-  EXPECT_FALSE(HasFile(kWorkFile));
+  EXPECT_FALSE(HasFile(kLeftResults));
 }
 
 TEST_F(DeletePlayerTest, OneGameIsOneGame) {
-  WriteResults(kResults, SomeResults());
+  WriteResults(kAResults, SomeResults());
   OpenSetup(TwoGrades());
   Delete("Rovers", "Archer, Jo");
   EXPECT_EQ(Boxes().at(0).text,
@@ -89,7 +88,7 @@ TEST_F(DeletePlayerTest, OneGameIsOneGame) {
 }
 
 TEST_F(DeletePlayerTest, ACancelKeepsAllAndGoesBackToTheTeam) {
-  WriteResults(kResults, SomeResults());
+  WriteResults(kAResults, SomeResults());
   OpenSetup(TwoGrades());
   for (const char* player : {"Baker, Al", "Archer, Jo"}) {
     Delete("Rovers", player, "cancel");
@@ -103,7 +102,7 @@ TEST_F(DeletePlayerTest, ACancelKeepsAllAndGoesBackToTheTeam) {
     EXPECT_EQ(Focus(), "frmNames.txtAddSn");
   }
   EXPECT_EQ(File(kPlayerFile), FileOf(TwoGrades()));
-  EXPECT_EQ(File(kResults), FileOf(SomeResults()));
+  EXPECT_EQ(File(kAResults), FileOf(SomeResults()));
 }
 
 TEST_F(DeletePlayerTest, ACancelOfAPlayerWithoutResultsToo) {
@@ -119,15 +118,15 @@ TEST_F(DeletePlayerTest, OfTwoPlayersAlikeTheFirstOneIsDeleted) {
   const std::vector<PlayerRecord> players = {Player(7, "Cole", "Di", "Hawks", "A Grade"),
                                              Player(5, "Cole", "Di", "Rovers", "A Grade"),
                                              Player(9, "Cole", "Di", "Rovers", "A Grade")};
-  WriteResults(kResults, {Night(5, "Rovers", "Hawks"), Night(9, "Rovers", "Hawks")});
+  WriteResults(kAResults, {Night(5, "Rovers", "Hawks"), Night(9, "Rovers", "Hawks")});
   OpenSetup(players);
   Do("pick cboAddTm =Rovers");
   Do("pick lstPlayers 1");
   Do("answer ok");
   Do("click cmdDelName");
   EXPECT_TRUE(SamePlayers(File(kPlayerFile), FileOf({players[0], players[2]})));
-  ASSERT_EQ(Results(kResults).size(), 1U);
-  EXPECT_EQ(Results(kResults)[0].ID, 9);
+  ASSERT_EQ(Results(kAResults).size(), 1U);
+  EXPECT_EQ(Results(kAResults)[0].ID, 9);
 }
 
 TEST_F(DeletePlayerTest, TheLastPlayerLeavesAnEmptyFileAndTheFirstPlayersFace) {
@@ -187,7 +186,7 @@ TEST_F(DeletePlayerTest, AnIdAboveSixteenBitsIsToldAndNothingChanges) {
   EXPECT_EQ(InSession("Flag"), 0);
   EXPECT_TRUE(Shown("fraNamesMenu"));
   EXPECT_EQ(File(kPlayerFile), FileOf(players));
-  EXPECT_FALSE(HasFile(kResults));
+  EXPECT_FALSE(HasFile(kAResults));
   Do("key Esc");
   EXPECT_TRUE(Enabled("cmdAddCancel"));
 }
@@ -196,24 +195,24 @@ TEST_F(DeletePlayerTest, AStaleWorkFileLeavesItsRecordsBehindTheNewOnes) {
   const std::vector<PlayerRecord> stale = {
       Player(91, "Old", "One", "T", "G"), Player(92, "Old", "Two", "T", "G"),
       Player(93, "Old", "Three", "T", "G"), Player(94, "Old", "Four", "T", "G")};
-  WritePlayers(kWorkFile, stale);
+  WritePlayers(kLeftResults, stale);
   OpenSetup(TwoGrades());
   Delete("Rovers", "Baker, Al");
   std::vector<PlayerRecord> players = TwoGrades();
   players.erase(players.begin() + 1);
   players.push_back(stale[3]);
   EXPECT_TRUE(SamePlayers(File(kPlayerFile), FileOf(players)));
-  EXPECT_FALSE(HasFile(kWorkFile));
+  EXPECT_FALSE(HasFile(kLeftResults));
 }
 
 TEST_F(DeletePlayerTest, AStaleWorkFileIsUsedUpByTheResults) {
   const std::vector<ResultRecord> stale(4, Night(99, "Old", "Older"));
-  WriteResults(kWorkFile, stale);
-  WriteResults(kResults, SomeResults());
+  WriteResults(kLeftResults, stale);
+  WriteResults(kAResults, SomeResults());
   OpenSetup(TwoGrades());
   Delete("Rovers", "Baker, Al");
   const std::vector<ResultRecord> all = SomeResults();
-  EXPECT_TRUE(SameResults(File(kResults),
+  EXPECT_TRUE(SameResults(File(kAResults),
                           FileOf(std::vector<ResultRecord>{all[1], all[2], all[4], stale[3]})));
   EXPECT_EQ(Saved().size(), 3U);
 }
@@ -227,11 +226,11 @@ TEST_F(DeletePlayerTest, ACopyThatCannotTakeItsPlaceIsOverwrittenByTheNextDeleti
   Do("click cmdDelName");
   EXPECT_EQ(BoxTexts().at(1), "CAN'T RENAME WITH DIFFERENT DRIVE    ");
   EXPECT_EQ(File(kPlayerFile), FileOf(TwoGrades()));
-  EXPECT_EQ(Players(kWorkFile).size(), 3U);
+  EXPECT_EQ(Players(kLeftResults).size(), 3U);
   Do("click cmdCancelDel");
   Delete("Rovers", "Baker, Al");
   EXPECT_EQ(Saved().size(), 3U);
-  EXPECT_FALSE(HasFile(kWorkFile));
+  EXPECT_FALSE(HasFile(kLeftResults));
 }
 
 TEST_F(DeletePlayerTest, AGradeThatNoFileCanBeNamedForKeepsItsPlayers) {
@@ -267,13 +266,13 @@ TEST_F(DeletePlayerTest, NonsenseIsCarriedOver) {
 
 TEST_F(DeletePlayerTest, TooManyResultsAreToldAndNobodyGoes) {
   const std::string results(32768 * kResultLength, ' ');
-  WriteFile(kResults, results);
+  WriteFile(kAResults, results);
   OpenSetup(TwoGrades());
   Pick("Rovers", "Baker, Al");
   Do("click cmdDelName");
   EXPECT_EQ(BoxTexts(), TextList{"OVERFLOW    "});
   EXPECT_EQ(File(kPlayerFile), FileOf(TwoGrades()));
-  EXPECT_EQ(File(kResults), results);
+  EXPECT_EQ(File(kAResults), results);
 }
 
 }  // namespace

@@ -3,8 +3,6 @@
 namespace marlowbeck {
 namespace {
 
-constexpr const char* kResults = "Winter_A Grade.qzr";
-
 /// A player picked in the list and taken up for a change.
 class EditPlayerTest : public SetupTest {
  protected:
@@ -89,7 +87,7 @@ TEST_F(EditPlayerTest, WithoutResultsThePlayerMovesToAnotherTeamAndGrade) {
 }
 
 TEST_F(EditPlayerTest, WithResultsTeamAndGradeAreLocked) {
-  WriteResults(kResults, {Night(3, "Hawks", "Rovers"), Night(2, "Rovers", "Hawks")});
+  WriteResults(kAResults, {Night(3, "Hawks", "Rovers"), Night(2, "Rovers", "Hawks")});
   OpenSetup(TwoGrades());
   Edit("Rovers", "Baker, Al");
   for (const std::string combo : {"cboAddTm", "cboAddGrd"}) {
@@ -109,7 +107,7 @@ TEST_F(EditPlayerTest, WithResultsTeamAndGradeAreLocked) {
 }
 
 TEST_F(EditPlayerTest, ResultsOfOthersLockNothing) {
-  WriteResults(kResults, {Night(3, "Hawks", "Rovers"), Night(22, "Rovers", "Hawks")});
+  WriteResults(kAResults, {Night(3, "Hawks", "Rovers"), Night(22, "Rovers", "Hawks")});
   WriteResults("Winter_B Grade.qzr", {Night(2, "Rovers", "Hawks")});
   OpenSetup(TwoGrades());
   Edit("Rovers", "Baker, Al");
@@ -129,7 +127,7 @@ TEST_F(EditPlayerTest, WhileItCannotBeKnownWhetherThereAreResultsNobodyMoves) {
 }
 
 TEST_F(EditPlayerTest, CancelEditFreesAndForgets) {
-  WriteResults(kResults, {Night(2, "Rovers", "Hawks")});
+  WriteResults(kAResults, {Night(2, "Rovers", "Hawks")});
   OpenSetup(TwoGrades());
   for (const char* cancel : {"click cmdClear", "key Esc"}) {
     Edit("Rovers", "Baker, Al");
@@ -176,7 +174,7 @@ TEST_F(EditPlayerTest, AnIdAboveSixteenBitsIsToldAndNothingChanges) {
   Do("click cmdCancelDel");
   EXPECT_TRUE(Enabled("cmdAddCancel"));
   EXPECT_EQ(File(kPlayerFile), FileOf(players));
-  EXPECT_FALSE(HasFile(kResults));
+  EXPECT_FALSE(HasFile(kAResults));
 }
 
 TEST_F(EditPlayerTest, TheHighestIdOfSixteenBitsIsEdited) {
@@ -206,7 +204,7 @@ TEST_F(EditPlayerTest, APlayerMovedIntoANewGradeStaysWhereHeWasAndIsAddedThere) 
 TEST_F(EditPlayerTest, AResultsFileComesAboutWithTheLookIntoIt) {
   OpenSetup(TwoGrades());
   Edit("Rovers", "Baker, Al");
-  EXPECT_EQ(File(kResults), "");
+  EXPECT_EQ(File(kAResults), "");
 }
 
 TEST_F(EditPlayerTest, NamesOfThirtyLettersComeBackWhole) {
@@ -243,9 +241,9 @@ TEST_F(EditPlayerTest, BlankNamesAreRefusedAndTheEditGoesOn) {
 }
 
 TEST_F(EditPlayerTest, ACutResultsFileIsReadByItsWholeRecords) {
-  WriteFile(kResults, FileOf(std::vector<ResultRecord>{Night(3, "Hawks", "Rovers"),
-                                                       Night(2, "Rovers", "Hawks")})
-                          .substr(0, 2 * kResultLength - 1));
+  WriteFile(kAResults, FileOf(std::vector<ResultRecord>{Night(3, "Hawks", "Rovers"),
+                                                        Night(2, "Rovers", "Hawks")})
+                           .substr(0, 2 * kResultLength - 1));
   OpenSetup(TwoGrades());
   Edit("Rovers", "Baker, Al");
   EXPECT_TRUE(Boxes().empty());

@@ -5,9 +5,6 @@
 namespace marlowbeck {
 namespace {
 
-constexpr const char* kResults = "Winter_A Grade.qzr";
-constexpr const char* kLadder = "Winter_A Grade.qzl";
-
 class RenameTest : public SetupTest {
  protected:
   void RenameTeam(const std::string& team, const std::string& reply) {
@@ -63,8 +60,8 @@ class WorkedExample : public RenameTest {
 TEST_F(WorkedExample, EveryFileByteForByte) {
   const std::string other_results =
       FileOf(std::vector<ResultRecord>{Night(4, "Bulls", "Rovers", 24)});
-  WriteResults(kResults, {rovers_at_hawks, hawks_at_rovers});
-  WriteFile(kLadder, FileOf(matches));
+  WriteResults(kAResults, {rovers_at_hawks, hawks_at_rovers});
+  WriteFile(kALadder, FileOf(matches));
   WriteFile("Winter_B Grade.qzr", other_results);
   OpenSetup(players);
 
@@ -77,8 +74,8 @@ TEST_F(WorkedExample, EveryFileByteForByte) {
   matches[0].AwayTeam = "Rangers";
   EXPECT_TRUE(SamePlayers(File(kPlayerFile), FileOf(players)));
   const std::string results = FileOf(std::vector<ResultRecord>{rovers_at_hawks, hawks_at_rovers});
-  EXPECT_TRUE(SameResults(File(kResults), results));
-  EXPECT_TRUE(SameMatches(File(kLadder), FileOf(matches)));
+  EXPECT_TRUE(SameResults(File(kAResults), results));
+  EXPECT_TRUE(SameMatches(File(kALadder), FileOf(matches)));
   EXPECT_EQ(GradeFiles(), (TextList{"A Grade.qzl", "A Grade.qzr", "B Grade.qzr"}));
 
   RenameGrade("A Grade", "Premier");
@@ -127,8 +124,8 @@ TEST_F(RenameTest, ThenTheListsAreAsAtTheStart) {
 TEST_F(RenameTest, FilesOfResultsAndLadderComeAboutWithARenamedTeam) {
   OpenSetup(TwoGrades());
   RenameTeam("Rovers", "Rangers");
-  EXPECT_EQ(File(kResults), "");
-  EXPECT_EQ(File(kLadder), "");
+  EXPECT_EQ(File(kAResults), "");
+  EXPECT_EQ(File(kALadder), "");
 }
 
 TEST_F(RenameTest, ABlankReplyRenamesNothing) {
@@ -168,7 +165,7 @@ TEST_F(RenameTest, ATeamOfAnyGradeIsInUseInAnyCase) {
 }
 
 TEST_F(RenameTest, AGradeIsInUseInAnyCase) {
-  WriteResults(kResults, {Night(1, "Rovers", "Hawks")});
+  WriteResults(kAResults, {Night(1, "Rovers", "Hawks")});
   OpenSetup(TwoGrades());
   for (const char* reply : {"B Grade", "a grade", " A GRADE "}) {
     RenameGrade("A Grade", reply);
@@ -183,13 +180,13 @@ TEST_F(RenameTest, TheBlankTeamIsNotRenamed) {
   const std::vector<PlayerRecord> players = {Player(1, "Archer", "Jo", "", "A Grade"),
                                              Player(2, "Baker", "Al", "Rovers", "A Grade")};
   const std::vector<ResultRecord> results = {Night(2, "Rovers", "")};
-  WriteResults(kResults, results);
+  WriteResults(kAResults, results);
   OpenSetup(players);
   RenameTeam("", "Rangers");
   EXPECT_TRUE(Boxes().empty());
   ExpectBackAtTheNames();
   EXPECT_EQ(File(kPlayerFile), FileOf(players));
-  EXPECT_EQ(File(kResults), FileOf(results));
+  EXPECT_EQ(File(kAResults), FileOf(results));
 }
 
 TEST_F(RenameTest, TheBlankGradeGetsAName) {
@@ -247,7 +244,7 @@ TEST_F(RenameTest, AGradeWithoutResultsLosesItsLadderConfiguration) {
 TEST_F(RenameTest, AFileOfTheNewNameEndsTheChainAndStays) {
   const std::string old_ladder = FileOf(std::vector<LadderRecord>{Match("Old", "Older")});
   WriteFile("Winter_A Grade.qzr", "");
-  WriteFile(kLadder, FileOf(std::vector<LadderRecord>{Match("Rovers", "Hawks")}));
+  WriteFile(kALadder, FileOf(std::vector<LadderRecord>{Match("Rovers", "Hawks")}));
   WriteFile("Winter_A Grade.qzs", "\"Winter\"\r\n");
   WriteFile("Winter_Premier.qzl", old_ladder);
   OpenSetup(TwoGrades());
@@ -314,16 +311,16 @@ TEST_F(RenameTest, ANameThatIsTakenOnceItIsCutIsInUse) {
 
 TEST_F(RenameTest, TeamsOfThirtyAndMoreLettersAreCutEverywhereAlike) {
   const std::string thirty = "123456789012345678901234567890";
-  WriteResults(kResults, {Night(1, "Rovers", "Hawks"), Night(3, "Hawks", "Rovers")});
-  WriteFile(kLadder, FileOf(std::vector<LadderRecord>{Match("Rovers", "Hawks")}));
+  WriteResults(kAResults, {Night(1, "Rovers", "Hawks"), Night(3, "Hawks", "Rovers")});
+  WriteFile(kALadder, FileOf(std::vector<LadderRecord>{Match("Rovers", "Hawks")}));
   OpenSetup(TwoGrades());
   RenameTeam("Rovers", thirty + "1");
   EXPECT_EQ(BoxTexts(), TextList{Renamed("Rovers", thirty + "1")});
   EXPECT_EQ(Saved().at(0).Team, thirty);
-  EXPECT_EQ(Results(kResults).at(0).Team, thirty);
-  EXPECT_EQ(Results(kResults).at(1).Opposition, thirty);
+  EXPECT_EQ(Results(kAResults).at(0).Team, thirty);
+  EXPECT_EQ(Results(kAResults).at(1).Opposition, thirty);
   EXPECT_TRUE(
-      SameMatches(File(kLadder), FileOf(std::vector<LadderRecord>{Match(thirty, "Hawks")})));
+      SameMatches(File(kALadder), FileOf(std::vector<LadderRecord>{Match(thirty, "Hawks")})));
   // And back again.
   RenameTeam(thirty, "Rovers");
   EXPECT_EQ(File(kPlayerFile), FileOf(TwoGrades()));
@@ -331,11 +328,11 @@ TEST_F(RenameTest, TeamsOfThirtyAndMoreLettersAreCutEverywhereAlike) {
 
 TEST_F(RenameTest, QuotesAndCommasAreLettersLikeOthers) {
   const std::string name = "\"The\" Rovers, O'Hara & Co";
-  WriteResults(kResults, {Night(1, "Rovers", "Hawks")});
+  WriteResults(kAResults, {Night(1, "Rovers", "Hawks")});
   OpenSetup(TwoGrades());
   RenameTeam("Rovers", name);
   EXPECT_EQ(BoxTexts(), TextList{Renamed("Rovers", name)});
-  EXPECT_EQ(Results(kResults).at(0).Team, FixedWidth(name, 30));
+  EXPECT_EQ(Results(kAResults).at(0).Team, FixedWidth(name, 30));
   RenameGrade("A Grade", "\"A\", Grade");
   EXPECT_EQ(GradeFiles(), (TextList{"\"A\", Grade.qzl", "\"A\", Grade.qzr"}));
   RenameTeam(name, "Rovers");
@@ -343,16 +340,16 @@ TEST_F(RenameTest, QuotesAndCommasAreLettersLikeOthers) {
 }
 
 TEST_F(RenameTest, ATeamMayHaveASlash) {
-  WriteResults(kResults, {Night(1, "Rovers", "Hawks")});
+  WriteResults(kAResults, {Night(1, "Rovers", "Hawks")});
   OpenSetup(TwoGrades());
   RenameTeam("Rovers", "Rovers/2\\3:*?");
   EXPECT_EQ(Boxes().size(), 1U);
-  EXPECT_EQ(Results(kResults).at(0).Team, FixedWidth("Rovers/2\\3:*?", 30));
+  EXPECT_EQ(Results(kAResults).at(0).Team, FixedWidth("Rovers/2\\3:*?", 30));
 }
 
 TEST_F(RenameTest, AGradeNamedForNoFileKeepsItsFilesAndIsNamedBack) {
-  WriteResults(kResults, {Night(1, "Rovers", "Hawks")});
-  WriteFile(kLadder, FileOf(std::vector<LadderRecord>{Match("Rovers", "Hawks")}));
+  WriteResults(kAResults, {Night(1, "Rovers", "Hawks")});
+  WriteFile(kALadder, FileOf(std::vector<LadderRecord>{Match("Rovers", "Hawks")}));
   OpenSetup(TwoGrades());
   RenameGrade("A Grade", "A/B");
   EXPECT_EQ(BoxTexts(), TextList{Renamed("A Grade", "A/B")});
@@ -389,11 +386,11 @@ TEST_F(RenameTest, TeamsOfOtherGradesAndTheirFilesAreLeftAlone) {
 }
 
 TEST_F(RenameTest, NamesThatDifferInCaseAreOthers) {
-  WriteResults(kResults, {Night(1, "ROVERS", "Rovers")});
+  WriteResults(kAResults, {Night(1, "ROVERS", "Rovers")});
   OpenSetup(TwoGrades());
   RenameTeam("Rovers", "Rangers");
-  EXPECT_EQ(Results(kResults).at(0).Team, FixedWidth("ROVERS", 30));
-  EXPECT_EQ(Results(kResults).at(0).Opposition, FixedWidth("Rangers", 30));
+  EXPECT_EQ(Results(kAResults).at(0).Team, FixedWidth("ROVERS", 30));
+  EXPECT_EQ(Results(kAResults).at(0).Opposition, FixedWidth("Rangers", 30));
 }
 
 TEST_F(RenameTest, FilesCutInARecordKeepTheBytesBehindTheirWholeRecords) {
@@ -401,44 +398,44 @@ TEST_F(RenameTest, FilesCutInARecordKeepTheBytesBehindTheirWholeRecords) {
       FileOf(std::vector<ResultRecord>{Night(1, "Rovers", "Hawks"), Night(2, "Rovers", "Hawks")});
   const std::string ladder =
       FileOf(std::vector<LadderRecord>{Match("Rovers", "Hawks"), Match("Hawks", "Rovers")});
-  WriteFile(kResults, results.substr(0, results.size() - 1));
-  WriteFile(kLadder, ladder.substr(0, ladder.size() - 1));
+  WriteFile(kAResults, results.substr(0, results.size() - 1));
+  WriteFile(kALadder, ladder.substr(0, ladder.size() - 1));
   OpenSetup(TwoGrades());
   RenameTeam("Rovers", "Rangers");
-  EXPECT_EQ(File(kResults), FileOf(std::vector<ResultRecord>{Night(1, "Rangers", "Hawks")}) +
-                                results.substr(kResultLength, kResultLength - 1));
-  EXPECT_EQ(File(kLadder), FileOf(std::vector<LadderRecord>{Match("Rangers", "Hawks")}) +
-                               ladder.substr(kLadderLength, kLadderLength - 1));
+  EXPECT_EQ(File(kAResults), FileOf(std::vector<ResultRecord>{Night(1, "Rangers", "Hawks")}) +
+                                 results.substr(kResultLength, kResultLength - 1));
+  EXPECT_EQ(File(kALadder), FileOf(std::vector<LadderRecord>{Match("Rangers", "Hawks")}) +
+                                ladder.substr(kLadderLength, kLadderLength - 1));
 }
 
 TEST_F(RenameTest, TooManyResultsAreToldAfterThePlayersAreRenamed) {
   const std::string results(32768 * kResultLength, ' ');
-  WriteFile(kResults, results);
+  WriteFile(kAResults, results);
   OpenSetup(TwoGrades());
   RenameTeam("Rovers", "Rangers");
   EXPECT_EQ(BoxTexts(), TextList{"OVERFLOW    "});
   EXPECT_EQ(Saved().at(0).Team, FixedWidth("Rangers", 30));
-  EXPECT_EQ(File(kResults), results);
-  EXPECT_FALSE(HasFile(kLadder));
+  EXPECT_EQ(File(kAResults), results);
+  EXPECT_FALSE(HasFile(kALadder));
 }
 
 TEST_F(RenameTest, ATeamIsNamedBackAfterAFailureHalfWay) {
   HOLDS_FOR_MODELS_ALONE("one face's disk fails");
   const std::vector<ResultRecord> results = {Night(1, "Rovers", "Hawks")};
-  WriteResults(kResults, results);
-  WriteFile(kLadder, FileOf(std::vector<LadderRecord>{Match("Rovers", "Hawks")}));
+  WriteResults(kAResults, results);
+  WriteFile(kALadder, FileOf(std::vector<LadderRecord>{Match("Rovers", "Hawks")}));
   OpenSetup(TwoGrades());
   Do("fault rename 2 57");  // that of the results
   RenameTeam("Rovers", "Rangers");
   EXPECT_EQ(BoxTexts(), TextList{"DEVICE I/O ERROR    "});
   EXPECT_EQ(Saved().at(0).Team, FixedWidth("Rangers", 30));
-  EXPECT_EQ(File(kResults), FileOf(results));
+  EXPECT_EQ(File(kAResults), FileOf(results));
   Do("click cmdAddCancel");
   Do("click imgPlayers");
   RenameTeam("Rangers", "Rovers");
   EXPECT_EQ(File(kPlayerFile), FileOf(TwoGrades()));
   RenameTeam("Rovers", "Rangers");
-  EXPECT_EQ(Results(kResults).at(0).Team, FixedWidth("Rangers", 30));
+  EXPECT_EQ(Results(kAResults).at(0).Team, FixedWidth("Rangers", 30));
 }
 
 TEST_F(RenameTest, AnEmptyPlayerFileHasNothingToRename) {

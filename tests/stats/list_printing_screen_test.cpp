@@ -7,7 +7,7 @@ namespace marlowbeck {
 namespace {
 
 constexpr const char* kAmount = "You must show AMOUNT to print!    ";
-constexpr const char* kCopies = "You must show NUMBER of COPIES to print!    ";
+constexpr const char* kNoCopies = "You must show NUMBER of COPIES to print!    ";
 
 class ListPrinting : public ListsTest {
  protected:
@@ -114,7 +114,7 @@ TEST_F(ListPrinting, CopiesThatReadBelowOneAreRefused) {
   OpenPanel();
   for (const char* copies : {"", "0", "abc", "0.9", "-1"}) {
     Do(std::string("type txtNoCHI ") + copies);
-    ExpectRefusal(kCopies);
+    ExpectRefusal(kNoCopies);
   }
 }
 

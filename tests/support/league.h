@@ -12,6 +12,7 @@ namespace marlowbeck {
 
 inline constexpr const char* kLeagueFile = "Winter.qza";
 inline constexpr const char* kAResults = "Winter_A Grade.qzr";
+inline constexpr const char* kALadder = "Winter_A Grade.qzl";
 inline constexpr const char* kBResults = "Winter_B Grade.qzr";
 
 /// Three grades. A Grade: Cubs, Hawks (eight players, ids 11 to 18), Lions, Rovers. B Grade: Bees,

@@ -138,7 +138,8 @@ bool GridView::HasLineBreaks() const {
   });
 }
 
-/// A column of figures is no narrower than they are; the others part what is left.
+/// A column of figures is no narrower than they are; the others part what is left, as told unless
+/// one of them would cut a word that another has room for.
 void GridView::ShareOutColumns() {
   const QStringList shares = table_.property(kColumnShares).toString().split(',');
   const int cols = std::min(table_.columnCount(), static_cast<int>(shares.size()));
@@ -158,27 +159,53 @@ void GridView::ShareOutColumns() {
     room -= width;
     parts -= share(col);
   }
+  std::vector<int> names;
   for (int col = 0; col < cols; ++col) {
-    if (share(col) == widest) table_.setColumnWidth(col, room * widest / parts);
+    if (share(col) != widest) continue;
+    table_.setColumnWidth(col, room * widest / parts);
+    names.push_back(col);
   }
+  for (const int col : names) MakeRoomForWords(col, names);
   FitRows(RowHeights::AsNeeded);
 }
 
+/// Takes what a column lacks for its longest word from others that have more than theirs need.
+void GridView::MakeRoomForWords(int col, const std::vector<int>& others) {
+  if (WidthOfColumn(col) <= table_.columnWidth(col)) return;
+  int lacking = WidthOfLongestWord(col) - table_.columnWidth(col);
+  for (const int other : others) {
+    if (lacking <= 0) return;
+    const int needed = std::max(WidthOfHeading(other), WidthOfLongestWord(other));
+    const int spare = table_.columnWidth(other) - needed;
+    const int given = std::clamp(spare, 0, lacking);
+    table_.setColumnWidth(other, table_.columnWidth(other) - given);
+    table_.setColumnWidth(col, table_.columnWidth(col) + given);
+    lacking -= given;
+  }
+}
+
+int GridView::WidthOfHeading(int col) const {
+  return heading_rows_ == 0 ? 0 : table_.horizontalHeader()->sectionSizeHint(col);
+}
+
 int GridView::WidthOfColumn(int col) const {
-  const int heading = heading_rows_ == 0 ? 0 : table_.horizontalHeader()->sectionSizeHint(col);
-  return std::max(heading, AsView().sizeHintForColumn(col)) + kAir;
+  return std::max(WidthOfHeading(col), AsView().sizeHintForColumn(col)) + kAir;
 }
 
 /// No word is broken.
 int GridView::LeastWidthOfNames(int col) const {
+  return std::max(kLeastNames, WidthOfLongestWord(col));
+}
+
+int GridView::WidthOfLongestWord(int col) const {
   static const QRegularExpression kBreak("(?<=-)|\\s");
-  int least = kLeastNames;
+  int longest = 0;
   for (int row = 0; row < table_.rowCount(); ++row) {
     for (const QString& word : table_.item(row, col)->text().split(kBreak)) {
-      least = std::max(least, table_.fontMetrics().horizontalAdvance(word) + 2 * kAir);
+      longest = std::max(longest, table_.fontMetrics().horizontalAdvance(word) + 2 * kAir);
     }
   }
-  return least;
+  return longest;
 }
 
 /// A row is as high as its name takes. Where no text is broken they are all alike, and a thousand

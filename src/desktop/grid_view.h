@@ -28,13 +28,16 @@ class GridView : public CaptionedView {
   bool eventFilter(QObject* watched, QEvent* event) override;
   void FitColumns();
   void ShareOutColumns();
+  void MakeRoomForWords(int col, const std::vector<int>& others);
   enum class RowHeights { Alike, AsNeeded };
   void FitRows(RowHeights heights);
   [[nodiscard]] bool HasLineBreaks() const;
   /// A table hides its measures, which are every view's.
   [[nodiscard]] const QAbstractItemView& AsView() const { return table_; }
+  [[nodiscard]] int WidthOfHeading(int col) const;
   [[nodiscard]] int WidthOfColumn(int col) const;
   [[nodiscard]] int LeastWidthOfNames(int col) const;
+  [[nodiscard]] int WidthOfLongestWord(int col) const;
   void ShowCurrent();
   void PressCell(int row, int col);
   [[nodiscard]] Qt::Alignment AlignmentOf(int col) const;

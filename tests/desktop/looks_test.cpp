@@ -90,6 +90,22 @@ TEST_F(Looks, TheLongestNamesBreakWhereADateIsChanged) {
   EXPECT_GE(match.height(), match.heightForWidth(match.width()));
 }
 
+TEST_F(Looks, ALongSurnameInAKnockOutTakesItsRoomFromTheGradesBesideIt) {
+  club_.WritePlayers("Winter.qza", {Player(1, "Featherstonehaugh", "Bo", "Rovers", "A Grade"),
+                                    Player(2, "Archer", "Jo", "Kings", "A Grade")});
+  club_.DoAll({"click imgKO", "click cmdOK", "shot {folder}/knock-out.png 800 600"});
+  const QTableWidget& table = club_.Find<QTableWidget>("grdKO");
+  EXPECT_NEAR(table.columnWidth(1), table.columnWidth(2), 1) << "as told while there is room";
+  club_.Do("click cmdALL");
+  constexpr int kMargins = 6;  // of a cell, in which no letter stands
+  const auto needed = [&](const char* word) {
+    return table.fontMetrics().horizontalAdvance(word) + kMargins;
+  };
+  EXPECT_GE(table.columnWidth(1), needed("Featherstonehaugh,"));
+  EXPECT_GE(table.columnWidth(2), needed("A Grade"));
+  EXPECT_EQ(table.horizontalScrollBar()->maximum(), 0);
+}
+
 TEST_F(Looks, TheCommandThatEnterGoesToLooksLikeIt) {
   club_.DoAll({"click imgPrinter", "click Image6", "click cmdChangeDate"});
   ASSERT_EQ(club_.Focus(), "frmChangeDate.cmdCancel");

@@ -22,13 +22,18 @@ QString Words(QString text) {
   return text;
 }
 
-int WidthOf(const QWidget& widget, const QString& text) {
-  return widget.fontMetrics().size(Qt::TextShowMnemonic, Words(text)).width();
+QSize SizeOf(const QWidget& widget, const QString& text) {
+  return widget.fontMetrics().size(Qt::TextShowMnemonic, Words(text));
 }
+
+int WidthOf(const QWidget& widget, const QString& text) { return SizeOf(widget, text).width(); }
 
 bool IsCut(const QLabel& label) {
   const QRect room = label.contentsRect();
-  if (!label.wordWrap()) return WidthOf(label, label.text()) > room.width();
+  if (!label.wordWrap()) {
+    const QSize words = SizeOf(label, label.text());
+    return words.width() > room.width() || words.height() > room.height();
+  }
   const QRect words = label.fontMetrics().boundingRect(QRect(0, 0, room.width(), 10000),
                                                        Qt::TextWordWrap, Words(label.text()));
   return words.height() > room.height() || words.width() > room.width();

@@ -81,6 +81,16 @@ TEST_F(Looks, ALadderOfLongNamesShowsAllItsColumnsInTheSmallestWindow) {
   EXPECT_EQ(dates.horizontalScrollBar()->maximum(), 0);
 }
 
+TEST_F(Looks, APictureIsTakenOnceWordsThatHaveGrownHaveTheirRoom) {
+  club_.DoAll({"click imgLadder", "click cmdGotoResults", "click cmdPL", "click cmdPenalty",
+               "pick lstPenalty 0", "type txtPenPts -2", "click cmdPenOK", "click cmdPenalty",
+               "pick lstPenalty 0", "shot {folder}/points.png"});
+  const QLabel& words = club_.Find<QLabel>("lblPen1");
+  ASSERT_TRUE(words.text().contains("ZERO")) << "the team has points to be erased";
+  EXPECT_GE(words.height(), words.sizeHint().height());
+  EXPECT_GE(words.width(), words.sizeHint().width());
+}
+
 TEST_F(Looks, TheLongestNamesBreakWhereADateIsChanged) {
   LengthenNames();
   club_.Do("click cmdChangeDate");

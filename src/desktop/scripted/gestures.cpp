@@ -14,6 +14,27 @@ void SendMouse(QWidget& widget, QEvent::Type type, QPoint at, Qt::MouseButton bu
   QApplication::sendEvent(&widget, &event);
 }
 
+/// How deep panels may lie in each other: a layout asks the one around it in the next round of
+/// events only.
+constexpr int kMostRounds = 50;
+
+/// Sees whether any layout was asked to lie anew.
+class LayoutWatch : public QObject {
+ public:
+  LayoutWatch() { qApp->installEventFilter(this); }
+
+  bool eventFilter(QObject* /*on*/, QEvent* event) override {
+    seen_ = seen_ || event->type() == QEvent::LayoutRequest;
+    return false;
+  }
+
+  void Forget() { seen_ = false; }
+  [[nodiscard]] bool HasSeenAny() const { return seen_; }
+
+ private:
+  bool seen_ = false;
+};
+
 }  // namespace
 
 void PressMouse(QWidget& widget, QPoint at, Qt::KeyboardModifiers modifiers) {
@@ -75,7 +96,12 @@ void TypeOver(QWidget& entry, const QString& text) {
 }
 
 void SettleEvents() {
-  QApplication::processEvents();
+  LayoutWatch watch;
+  int round = 0;
+  do {
+    watch.Forget();
+    QApplication::processEvents();
+  } while (watch.HasSeenAny() && ++round < kMostRounds);
   QApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
 }
 

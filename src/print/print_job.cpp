@@ -65,12 +65,12 @@ void PrintJob::Refuse(std::string_view message) {
   Warning(context_, message);
 }
 
-void PrintJob::PrintCopies(const std::function<bool()>& compose) {
+void PrintJob::PrintCopies(const std::function<bool()>& compose, PageTurns turns) {
   const int copies = Integer::Narrow(options_.copies);
   for (int copy = 1; copy <= copies; ++copy) {
     page_.SetFont();
     if (!compose()) return;
-    page_.NewPage();
+    if (copy < copies || turns == PageTurns::AfterEachCopy) page_.NewPage();
   }
   context_.platform.printer.EndDoc();
 }

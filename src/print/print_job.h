@@ -42,9 +42,13 @@ class PrintJob {
   /// Throws the document away and warns.
   void Refuse(std::string_view message);
 
+  /// Where the page is turned once a copy is there.
+  enum class PageTurns { AfterEachCopy, BetweenCopies };
+
   /// Composes each copy on a page of its own, which begins with the printer prepared anew, and
   /// sends the document once all are there. `compose` answers false when it has given up.
-  void PrintCopies(const std::function<bool()>& compose);
+  void PrintCopies(const std::function<bool()>& compose,
+                   PageTurns turns = PageTurns::AfterEachCopy);
 
  private:
   PrintJob(const Context& context, const PrintOptions& options)

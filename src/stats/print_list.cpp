@@ -28,7 +28,7 @@ class ListPrint {
     const TableLayout layout = Measured();
     if (!job_.FitsAcross(layout.Width())) return;
     GetSeason(context_);
-    job_.PrintCopies([&] { return Compose(layout); });
+    job_.PrintCopies([&] { return Compose(layout); }, PrintJob::PageTurns::BetweenCopies);
   }
 
  private:

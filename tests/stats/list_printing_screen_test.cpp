@@ -283,6 +283,23 @@ TEST_F(ListPrinting, EachCopyIsAPageOfItsOwn) {
   EXPECT_TRUE(Boxes().empty());
 }
 
+// A copy is the printer's starting blank, four lines of heading and four rows, each of a box, three
+// rules and four cells; before the first copy the printer is prepared once more.
+TEST_F(ListPrinting, ThePageIsTurnedBetweenCopiesAndNotAfterTheLast) {
+  constexpr int kCopy = 1 + 4 + 4 * (1 + 3 + 4);
+  OpenPanel();
+  for (const int copies : {1, 2}) {
+    const int end = 1 + copies * kCopy + (copies - 1) + 1;
+    for (const int fails : {end, end + 1}) {
+      DoAll({"type txtNoCHI " + std::to_string(copies), "printer fail " + std::to_string(fails),
+             "click cmdBothOKHI"});
+      EXPECT_EQ(Count("killed"), fails == end ? 1 : 0) << copies << " copies, operation " << fails;
+      EXPECT_EQ(Count("printed"), fails == end ? 0 : 1) << copies << " copies, operation " << fails;
+      Do("click cmdHiPrint");
+    }
+  }
+}
+
 TEST_F(ListPrinting, ATableThatTakesTheWholeWidthStillFitsAndOneTwipMoreDoesNot) {
   OpenPanel();
   Do("printer width 3600");

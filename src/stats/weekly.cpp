@@ -21,6 +21,8 @@ void frmPMenu::DoWeekly() {
   // What an earlier visit listed is nothing to pick from where there is no grade any more.
   cboResTeam.Clear();
   lstAllDates.Clear();
+  ForgetNight();
+  ClearWeekGrids();
   OfferNight(false);
   GetGrades(context_, cboResGrade);
   // Without a grade there is no season to have a title.

@@ -51,6 +51,9 @@ void LookAtEvents(World& world, Arguments& arguments, Json& answer) {
   world.log.MoveInto(answer);
 }
 
+/// Each way. A window far larger than any display cannot be painted.
+constexpr int kMostPixels = 8192;
+
 struct Picture {
   std::string file;
   std::optional<std::pair<int, int>> size;
@@ -74,6 +77,9 @@ Picture ReadPicture(Arguments& arguments) {
   const auto width = WholeNumber(TakeLastWord(file));
   if (!height || !width) return {whole, std::nullopt};
   if (*width < 1 || *height < 1) arguments.Refuse("the size must be at least 1 by 1");
+  if (*width > kMostPixels || *height > kMostPixels) {
+    arguments.Refuse("the size must be at most 8192 by 8192");
+  }
   return {file, std::pair(*width, *height)};
 }
 

@@ -192,6 +192,11 @@ TEST_F(Looking, ShotIsRefusedWithoutAFileOrWithNoSize) {
   EXPECT_EQ(Refused("shot menu.png 0 600"), "shot: the size must be at least 1 by 1");
 }
 
+TEST_F(Looking, ShotIsRefusedOfAWindowThatNoMachineCanPaint) {
+  EXPECT_EQ(Refused("shot menu.png 8193 600"), "shot: the size must be at most 8192 by 8192");
+  EXPECT_EQ(Refused("shot menu.png 800 99999"), "shot: the size must be at most 8192 by 8192");
+}
+
 TEST_F(Looking, EventsOfTheStartAreInTheFirstAnswerThatHasAny) {
   prepare = [](Workbench& made) { made.context.platform.sound.Beep(); };
   Do("get txtName");

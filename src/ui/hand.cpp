@@ -20,6 +20,13 @@ Outcome CheckLive(const Control& control) {
   return {};
 }
 
+/// The same of a screen.
+Outcome CheckLive(const Screen& screen) {
+  if (!screen.Visible()) return {screen.Name() + " is hidden", false};
+  if (!screen.Enabled()) return {screen.Name() + " is disabled", false};
+  return {};
+}
+
 template <typename T>
 T* As(Control& control) {
   return dynamic_cast<T*>(&control);
@@ -301,13 +308,12 @@ Outcome Hand::Hover(Control& control) {
 }
 
 Outcome Hand::HoverScreen(Screen& screen) {
-  if (!screen.Visible()) return {screen.Name() + " is hidden", false};
+  if (Outcome check = CheckLive(screen); !check.Done()) return check;
   return Whole([&] { screen.MouseMove(); });
 }
 
 Outcome Hand::CloseScreen(Screen& screen) {
-  if (!screen.Visible()) return {screen.Name() + " is hidden", false};
-  if (!screen.Enabled()) return {screen.Name() + " is disabled", false};
+  if (Outcome check = CheckLive(screen); !check.Done()) return check;
   return Whole([&] { screen.CloseButton(); });
 }
 

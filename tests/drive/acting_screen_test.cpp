@@ -362,6 +362,23 @@ TEST_F(Acting, HoverIsRefusedWhereNobodyCouldAct) {
   EXPECT_EQ(Refused("hover cmdOff"), "cmdOff is hidden");
 }
 
+TEST_F(Acting, HoverIsRefusedOverAScreenThatIsDisabled) {
+  Change([](Workbench& bench) {
+    bench.InScreens().Show("frmShelf");
+    bench.SetEnabled(false);
+  });
+  EXPECT_EQ(Refused("hover frmBench"), "frmBench is disabled");
+  Do("hover frmShelf");
+}
+
+TEST_F(Acting, HoverIsRefusedOverAScreenThatIsHidden) {
+  Change([](Workbench& bench) {
+    bench.InScreens().Show("frmShelf");
+    bench.InScreens().Hide(bench);
+  });
+  EXPECT_EQ(Refused("hover frmBench"), "frmBench is hidden");
+}
+
 TEST_F(Acting, AMenuStaysDownUntilSomethingElseIsDone) {
   Do("click mnuFile");
   Refused("click lblPlain");

@@ -112,10 +112,13 @@ Outcome WindowHand::CheckLive(const Control& control) const {
 
 Outcome WindowHand::Taken() { return windows_.TakeOutcome().value_or(Outcome{}); }
 
-Outcome WindowHand::CheckSeen(const Screen& screen) const {
+Outcome WindowHand::CheckLive(const Screen& screen) const {
   const ScreenWindow* const window = windows_.WindowOf(screen);
-  if (window != nullptr && window->Window().isVisible()) return {};
-  return {screen.Name() + " is hidden", false};
+  if (window == nullptr || !window->Window().isVisible()) {
+    return {screen.Name() + " is hidden", false};
+  }
+  if (!window->Window().isEnabled()) return {screen.Name() + " is disabled", false};
+  return {};
 }
 
 bool WindowHand::TakesSecondClick(const Control& control) const {
@@ -265,18 +268,16 @@ Outcome WindowHand::Hover(Control& control) {
 }
 
 Outcome WindowHand::HoverScreen(const Screen& screen) {
-  if (Outcome check = CheckSeen(screen); !check.Done()) return check;
+  if (Outcome check = CheckLive(screen); !check.Done()) return check;
   CloseDropped();
   MoveMouse(windows_.WindowOf(screen)->Window(), {1, 1});
   return Taken();
 }
 
 Outcome WindowHand::CloseScreen(const Screen& screen) {
-  if (Outcome check = CheckSeen(screen); !check.Done()) return check;
-  QWidget& window = windows_.WindowOf(screen)->Window();
-  if (!window.isEnabled()) return {screen.Name() + " is disabled", false};
+  if (Outcome check = CheckLive(screen); !check.Done()) return check;
   CloseDropped();
-  window.close();
+  windows_.WindowOf(screen)->Window().close();
   return Taken();
 }
 

@@ -47,7 +47,7 @@ class WindowHand {
 
   [[nodiscard]] View& ViewOf(const Control& control) const;
   [[nodiscard]] Outcome CheckLive(const Control& control) const;
-  [[nodiscard]] Outcome CheckSeen(const Screen& screen) const;
+  [[nodiscard]] Outcome CheckLive(const Screen& screen) const;
   [[nodiscard]] bool HasLine(const Control& control, int line) const;
   [[nodiscard]] bool HasCell(const Control& control, int row, int col) const;
   /// The control is still there for the second click of a double click, and answers to it.

@@ -29,6 +29,7 @@ void frmDB::Open(std::string_view screen) {
 }
 
 void frmDB::OpenWithFile(std::string_view screen) {
+  Menus();
   if (!session_.PlayerFile.empty()) Open(screen);
 }
 

@@ -473,6 +473,18 @@ TEST_F(MainMenu, EveryCommandTakesTheStatusLineAway) {
   }
 }
 
+TEST_F(MainMenu, CommandThatFindsNoFileOpenTakesTheStatusLineAwayToo) {
+  OpenTwoTeams();
+  Start();
+  WriteFile("FileName.qz3", "\"\"\r\n");
+  DoAll({"click mnuAbout", "click cmdOK"});
+  for (const char* command : {"click mnuSeason", "click mnuGameNames", "click mnuPlayersLists"}) {
+    DoAll({"hover frmDB", "hover imgExit", command});
+    EXPECT_EQ(Front(), "frmDB") << command;
+    EXPECT_FALSE(Shown("lblDescription")) << command;
+  }
+}
+
 TEST_F(MainMenu, DisabledCommandCannotBePointedAt) {
   OpenAtStart({});
   EXPECT_NE(Refused("hover imgSheets").find("imgSheets"), std::string::npos);

@@ -27,6 +27,15 @@ TEST_F(ErrorPath, BoxTellsTheWordsInCapitalsAndTheProgramGoesOn) {
   EXPECT_TRUE(Boxes().empty());
 }
 
+TEST_F(ErrorPath, FailureWhileAFileIsReadThroughLeavesItToBeOpenedAgain) {
+  DoAll({"fault read 1 57", "click imgLadder"});
+  EXPECT_EQ(BoxTexts(), (std::vector<std::string>{"DEVICE I/O ERROR    "}));
+  EXPECT_EQ(Front(), "frmDB");
+  Do("click imgLadder");
+  EXPECT_EQ(Front(), "frmLadder");
+  EXPECT_EQ(Count("error"), 0);
+}
+
 TEST_F(ErrorPath, UnknownNumberHasWordsOfItsOwn) {
   DoAll({"fault open 1 1234", "click imgLadder"});
   EXPECT_EQ(BoxTexts(), (std::vector<std::string>{"AN UNRECOGNISED ERROR HAS OCCURED!    "}));

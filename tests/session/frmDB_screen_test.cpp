@@ -96,6 +96,29 @@ TEST_F(MainMenu, LastCompetitionOpensByItself) {
   }
 }
 
+TEST_F(MainMenu, FileThatAnotherProgramOpenedIsTheOpenOneOnComingBack) {
+  OpenTwoTeams();
+  WritePlayers("Other.qza", {Player(7, "Cole", "Sam", "Kings", "B Grade")});
+  Start();
+  NameOpenFile("Other.qza");
+  DoAll({"click mnuAbout", "click cmdOK"});
+  EXPECT_EQ(OpenFile(), InFolder("Other.qza"));
+  EXPECT_EQ(Title("frmDB"), "[Marlowbeck] Filename: OTHER");
+  EXPECT_EQ(Caption("lblHMPlayers"), "1 Player Listed in File. ");
+}
+
+TEST_F(MainMenu, AnotherCompetitionGoesOnWithTheSameWorkDate) {
+  OpenTwoTeams();
+  WriteFile("WkDate.qz3", "#2004-03-10#\r\n");
+  WritePlayers("Other.qza", {Player(1, "Reed", "Jo", "Rovers", "B Grade"),
+                             Player(2, "Hill", "Al", "Hawks", "B Grade")});
+  DoAll({"click imgSheets", "date Cal 2004-04-07", "click cmdGotoResults", "close frmResults"});
+  DoAll({"file Other.qza", "click mnuOpen"});
+  EXPECT_EQ(File("WkDate.qz3"), "#2004-04-07#\r\n");
+  Do("click imgSheets");
+  EXPECT_EQ(DateOf("Cal"), "2004-04-07");
+}
+
 TEST_F(MainMenu, FileOfNoBytesIsAValidEmptyCompetition) {
   OpenAtStart({});
   EXPECT_EQ(Caption("lblHMPlayers"), " Current File is Empty ");

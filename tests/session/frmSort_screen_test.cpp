@@ -68,6 +68,14 @@ TEST_F(SortOnLeaving, FileInOrderIsNotSortedAgain) {
   EXPECT_EQ(Front(), "frmDB");
 }
 
+TEST_F(SortOnLeaving, EmptyFileNeverReachesTheSort) {
+  LaySeason(*this, {});
+  DoAll(kLeaveScoreSheets);
+  EXPECT_FALSE(HasFile("resfile.qz3"));
+  EXPECT_EQ(File("Winter_A Grade.qzr"), "");
+  EXPECT_EQ(Front(), "frmDB");
+}
+
 TEST_F(SortOnLeaving, OneRecordNeverReachesTheSort) {
   LaySeason(*this, {OutOfOrder()[0]});
   DoAll(kLeaveScoreSheets);

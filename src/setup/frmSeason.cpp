@@ -55,14 +55,16 @@ void frmSeason::cboGrades_Click() {
   fraGrade.Hide();
   fraEdit.Show();
   FileNames();
+  // What stands here when the reading fails is of this grade, not of the one before.
+  lblGradeName.SetCaption(session_.Grade);
+  lblOldSeason.SetCaption({});
+  txtNewSeason.SetText({});
+  cmdLicSave.Disable();
   Label1.Show();
   lblOldSeason.Show();
   GetSeason();
   SSCommand1.SetVisible(lblOldSeason.Visible());
-  lblGradeName.SetCaption(session_.Grade);
   lblOldSeason.SetCaption(session_.SeasonDescription);
-  txtNewSeason.SetText({});
-  cmdLicSave.Disable();
   txtNewSeason.SetFocus();
 }
 

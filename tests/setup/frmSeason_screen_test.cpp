@@ -69,6 +69,19 @@ TEST_F(SeasonTest, ThePresentTitleIsShownAndCanBePastedForChanging) {
   EXPECT_EQ(File(kFileB), "\"Winter 2004\"\r\n");
 }
 
+TEST_F(SeasonTest, AFailedPickLeavesNothingOfTheGradeBefore) {
+  WriteFile("Winter_A Grade.qzs", "\"Winter of A\"\r\n");
+  WriteFile(kFileB, "\"Winter of B\"\r\n");
+  OpenSeason();
+  DoAll({"pick cboGrades =A Grade", "click SSCommand1", "click cmdGrade", "fault close 1 57",
+         "pick cboGrades =B Grade"});
+  EXPECT_EQ(BoxTexts(), TextList{"DEVICE I/O ERROR    "});
+  EXPECT_EQ(Caption("lblGradeName"), "B Grade");
+  EXPECT_EQ(Caption("lblOldSeason"), "");
+  EXPECT_EQ(Text("txtNewSeason"), "");
+  EXPECT_FALSE(Enabled("cmdLicSave"));
+}
+
 TEST_F(SeasonTest, TheLineThatIsCurrentAlreadyCanBePicked) {
   OpenSeason();
   Do("pick cboGrades 0");

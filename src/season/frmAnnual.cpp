@@ -33,7 +33,6 @@ void frmAnnual::WirePicks() {
 void frmAnnual::Load() {
   picPrinter.Hide();
   lblNoneFound.Hide();
-  picFF.Hide();
   GridsOFF();
   font_box_.GetFont();
   ReadFileName(context_);

@@ -82,8 +82,7 @@ struct frmAnnual : Screen {
   void cmdBothOKHI_Click();
   void ClosePrintPanel();
   void DoALL();
-  /// Answers false when nothing came out of the printer.
-  bool PrintHI();
+  void PrintHI();
 
  private:
   void WirePicks();
@@ -91,6 +90,7 @@ struct frmAnnual : Screen {
   void ShowPicks(bool shown);
   void ShowGrids(bool shown);
   void OfferAll();
+  void AskAboutForfeits(bool asked);
   void FillTotals();
 
   const Context& context_;

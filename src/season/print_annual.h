@@ -16,7 +16,7 @@ struct AnnualPrint {
 };
 
 /// Prints a season on one page, as many copies as are asked for. What has no room is not printed at
-/// all, and that is told. Answers whether it has been printed.
-bool PrintAnnual(const Context& context, double copies, const AnnualPrint& season);
+/// all, and that is told.
+void PrintAnnual(const Context& context, double copies, const AnnualPrint& season);
 
 }  // namespace marlowbeck

@@ -128,6 +128,36 @@ TEST_F(SeasonReport, ForfeitsCountAsGamesOrNotByChoice) {
   EXPECT_EQ(File("Forfeits.qz3"), "1\r\n");
 }
 
+TEST_F(SeasonReport, TheQuestionAndItsFrameAreBothHiddenUntilThereIsAForfeit) {
+  Open();
+  const auto expect_asked = [this](bool asked) {
+    for (const char* control : {"fraFFYesNo", "picFF"}) {
+      EXPECT_EQ(Get(control)["visible"], asked) << control;
+    }
+  };
+  expect_asked(false);
+  DoAll({"pick cboTeams =Hawks", "pick lstPlayers 0"});
+  expect_asked(true);
+  Do("pick lstPlayers 1");
+  expect_asked(false);
+  DoAll({"pick lstPlayers 0", "pick cboTeams =Cubs"});
+  expect_asked(false);
+}
+
+TEST_F(SeasonReport, AnAnswerThatCannotBeKeptIsTakenBackAndCanBeGivenAgain) {
+  OpenHill();
+  Do("fault write 1 61");
+  Do("click optFFno");
+  EXPECT_EQ(EventsNamed("error").at(0)["number"], 61);
+  EXPECT_TRUE(Ticked("optFFyes"));
+  EXPECT_FALSE(Ticked("optFFno"));
+  EXPECT_EQ(Totals()[0], "3");
+  Do("click optFFno");
+  EXPECT_TRUE(Ticked("optFFno"));
+  EXPECT_EQ(Totals()[0], "2");
+  EXPECT_EQ(File("Forfeits.qz3"), "0\r\n");
+}
+
 TEST_F(SeasonReport, WithoutForfeitsNothingIsAsked) {
   OpenHill();
   Do("pick lstPlayers 1");
@@ -206,6 +236,16 @@ TEST_F(SeasonReport, TheClipboardGetsSeasonAndTotals) {
                                   "favourite spreadsheet or wordprocessor.    \r\r"
                                   "Note: When you leave this section,    \r"
                                   "the Clipboard will be cleared !"}));
+}
+
+TEST_F(SeasonReport, LeavingDoesNotClearTheClipboardWhateverTheBoxSaid) {
+  // KEPT: the box of the copy says that it is cleared.
+  OpenHill();
+  Do("click cmdClipAnnual");
+  const auto copied = EventsNamed("clipboard").back();
+  Do("click cmdCancelAnn");
+  EXPECT_EQ(Count("clipboard"), 0);
+  EXPECT_EQ(Do("clipboard")["text"], copied);
 }
 
 TEST_F(SeasonReport, ThePanelTellsThePrinterAndAsksForAll) {
@@ -290,13 +330,46 @@ TEST_F(SeasonReport, AllOfTheListArePrintedOneByOne) {
   EXPECT_TRUE(Shown("lstPlayers"));
 }
 
-TEST_F(SeasonReport, AFontThatIsTooLargeEndsTheRunOfAll) {
+// At 14 points a letter is 140 twips wide, and there is room for 11606 / 1.2 / 140 = 69 of them:
+// the columns of totals take all 69, those of nights 57 and the longest opposition's.
+TEST_F(SeasonReport, APlayerWhoCannotBePrintedHoldsNobodyElseUp) {
+  WriteFile("FontName.qz3", "14,\"MS Sans Serif\",#FALSE#,#FALSE#\r\n");
+  Open();
+  auto season = Season();
+  season[0].Opposition = std::string(13, 'W');
+  WriteResults(kAResults, season);
+  DoAll({"pick cboTeams =Hawks", "pick lstPlayers 1", "click cmdPrinter", "click optYesAnnual",
+         "click cmdBothOKHI"});
+  EXPECT_EQ(BoxTexts(),
+            (TextList{"Font is too large, please re-select.    ", "A L L    D O N E ! "}));
+  EXPECT_EQ(Count("killed"), 1);
+  const auto printed = EventsNamed("printed");
+  ASSERT_EQ(printed.size(), 1U);
+  EXPECT_EQ(PagesOf({printed[0]})[0].Words()[1], "Season Report:   Bo Hope");
+}
+
+TEST_F(SeasonReport, ARunOfAllEndsInItsWordsEvenIfNobodyCouldBePrinted) {
+  // KEPT: they say that all is done.
   WriteFile("FontName.qz3", "20,\"MS Sans Serif\",#FALSE#,#FALSE#\r\n");
   OpenPrinting();
   DoAll({"click optYesAnnual", "click cmdBothOKHI"});
-  EXPECT_EQ(BoxTexts(), (TextList{"Font is too large, please re-select.    "}));
+  EXPECT_EQ(BoxTexts(),
+            (TextList{"Font is too large, please re-select.    ",
+                      "Font is too large, please re-select.    ", "A L L    D O N E ! "}));
   EXPECT_EQ(Count("printed"), 0);
   EXPECT_TRUE(Shown("lstPlayers"));
+  EXPECT_EQ(Index("lstPlayers"), -1);
+  EXPECT_FALSE(Shown("picPrinter"));
+}
+
+TEST_F(SeasonReport, ASingleFailureOfThePrinterCostsOnePlayerOfTheRun) {
+  OpenPrinting();
+  DoAll({"click optYesAnnual", "printer fail 5", "click cmdBothOKHI"});
+  EXPECT_EQ(BoxTexts(), (TextList{"An unrecognised error occurred while trying to print.    ",
+                                  "A L L    D O N E ! "}));
+  const auto printed = EventsNamed("printed");
+  ASSERT_EQ(printed.size(), 1U);
+  EXPECT_EQ(PagesOf({printed[0]})[0].Words()[1], "Season Report:   Bo Hope");
 }
 
 TEST_F(SeasonReport, AFullPageIsRefused) {

@@ -46,8 +46,9 @@ bool PrintJob::AskHeading() {
   return answer != kAnswerCancel;
 }
 
-bool PrintJob::FitsAcross(double table_width) {
-  if (table_width <= page_.Width() - kLeastBesides) return true;
+bool PrintJob::FitsAcross(double table_width, Exactly exactly) {
+  const double room = page_.Width() - kLeastBesides;
+  if (table_width < room || (table_width == room && exactly == Exactly::Fits)) return true;
   Warning(context_, "Font is too large, please re-select.    ");
   context_.platform.printer.KillDoc();
   return false;

@@ -32,9 +32,11 @@ class PrintJob {
   /// The association's name and the season's title are wanted.
   [[nodiscard]] bool WithHeading() const { return with_heading_; }
 
+  /// What becomes of a table that leaves just as much beside it as has to stay free.
+  enum class Exactly { Fits, IsTooWide };
   /// Whether a table of this width has room on the page. Where it has not, that is told and the
   /// document thrown away.
-  [[nodiscard]] bool FitsAcross(double table_width);
+  [[nodiscard]] bool FitsAcross(double table_width, Exactly exactly = Exactly::Fits);
   /// How far down the last row of a page may reach.
   [[nodiscard]] double Foot(double pitch) const { return page_.Height() - (pitch + 400); }
   /// Refuses what has no room on one page, in the words of all reports.

@@ -17,6 +17,7 @@ namespace {
 constexpr const char* kWorkFile = "LegPegs.qz3";
 constexpr int kColumns = 6;
 constexpr int kFirstFigures = 3;
+constexpr int kRecordsPerGlance = 2048;  // between two looks at the bar
 
 }  // namespace
 
@@ -71,6 +72,7 @@ void frmPegRatio::ReCalc() {
   fraGrid.Hide();
   // What is not worked out to its end is neither printed nor copied.
   OfferCopies(false);
+  rows_.clear();
   session_.Grade = Trim(cboResGrade.Text());
   NameGradeFiles(session_);
   if (!AnyPegs()) {
@@ -81,6 +83,7 @@ void frmPegRatio::ReCalc() {
   try {
     CalcRatio();
   } catch (const RunTimeError&) {
+    rows_.clear();
     pbRatio.Hide();
     throw;
   }
@@ -89,6 +92,8 @@ void frmPegRatio::ReCalc() {
   lblHi1.SetCaption(session_.SeasonDescription);
   OfferCopies(true);
   fraGrid.Show();
+  // An open panel still has the amount of the list before.
+  if (picPrinter.Visible()) OfferAmount();
 }
 
 void frmPegRatio::GetSeason() { marlowbeck::GetSeason(context_); }
@@ -111,9 +116,11 @@ void frmPegRatio::CalcRatio() {
     sorted_by_ = &optAlfa;
   }
   PegRatios ratios(session_.Grade);
-  ReadFiles(ratios);
+  ReadPlayers(ratios);
   pbRatio.SetRange(0, ratios.PlayerCount());
+  pbRatio.SetValue(pbRatio.Min());
   pbRatio.Show();
+  ReadResults(ratios);
   rows_ = ratios.Rows();
   session_.RowCount = static_cast<int>(rows_.size());
   WriteRows();
@@ -123,15 +130,26 @@ void frmPegRatio::CalcRatio() {
   pbRatio.Hide();
 }
 
-void frmPegRatio::ReadFiles(PegRatios& ratios) {
+void frmPegRatio::ReadPlayers(PegRatios& ratios) {
   OpenFile(session_, context_.channels);
   context_.channels.ForEachRecord(Channel::Players,
                                   [&](Bytes record, int) { ratios.AddPlayer(PlayerView(record)); });
-  context_.channels.Close(Channel::Players);
-  OpenResultSFile(session_, context_.channels);
-  context_.channels.ForEachRecord(Channel::Results,
-                                  [&](Bytes record, int) { ratios.AddResult(ResultView(record)); });
   context_.channels.CloseAll();
+}
+
+void frmPegRatio::ReadResults(PegRatios& ratios) {
+  OpenResultSFile(session_, context_.channels);
+  context_.channels.ForEachRecord(Channel::Results, [&](Bytes record, int number) {
+    ratios.AddResult(ResultView(record));
+    if (number % kRecordsPerGlance == 0) ShowProgress(number);
+  });
+  context_.channels.CloseAll();
+}
+
+/// All players come along together, as far as the results have been read.
+void frmPegRatio::ShowProgress(int result) {
+  pbRatio.SetValue(pbRatio.Max() * result / int{session_.ResultCount});
+  context_.platform.display.Refresh();
 }
 
 void frmPegRatio::WriteRows() {

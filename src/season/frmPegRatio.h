@@ -78,9 +78,12 @@ struct frmPegRatio : Screen {
   void WirePrinting();
   void SortBy(OptionButton& option);
   [[nodiscard]] bool AnyPegs();
-  void ReadFiles(PegRatios& ratios);
+  void ReadPlayers(PegRatios& ratios);
+  void ReadResults(PegRatios& ratios);
+  void ShowProgress(int result);
   void WriteRows();
   void OfferCopies(bool offered);
+  void OfferAmount();
 
   const Context& context_;
   Session& session_;

@@ -24,13 +24,18 @@ void frmPegRatio::cmdHiPrint_Click() {
   fraPik.Hide();
   print_panel_.Open();
   lblCopies.SetCaption("Number of copies:  1");
-  optHI0.SetCaption("Print Entire List of " + std::to_string(session_.RowCount) + " Peg Ratios");
   optHI0.SetValue(true);
-  optHI0_Click();
+  OfferAmount();
+}
+
+/// Tells of the whole list as it is now, and takes it where it is chosen.
+void frmPegRatio::OfferAmount() {
+  optHI0.SetCaption("Print Entire List of " + std::to_string(rows_.size()) + " Peg Ratios");
+  if (optHI0.Value()) optHI0_Click();
 }
 
 void frmPegRatio::optHI0_Click() {
-  txtHI.SetText(std::to_string(session_.RowCount));
+  txtHI.SetText(std::to_string(rows_.size()));
   txtHI.Disable();
 }
 
@@ -42,19 +47,18 @@ void frmPegRatio::optHI1_Click() {
 
 /// No more can be printed than there is.
 void frmPegRatio::txtHI_Change() {
-  const int count = grdRatio.Rows() - 1;
-  if (optHI0.Value() || Val(txtHI.Text()) > count) txtHI.SetText(std::to_string(count));
+  const auto count = static_cast<double>(rows_.size());
+  if (optHI0.Value() || Val(txtHI.Text()) > count) txtHI.SetText(NumberText(count));
 }
 
 void frmPegRatio::cmdPrintRatios_Click() {
-  const double amount = Val(txtHI.Text());
+  const double amount = std::min(Val(txtHI.Text()), static_cast<double>(rows_.size()));
   if (amount < 1) {
     Warning(context_, "You must show AMOUNT to print!    ");
     return;
   }
   if (!print_panel_.CheckCopies()) return;
-  const auto count = static_cast<std::ptrdiff_t>(int{Integer::Narrow(amount)});
-  const auto last = rows_.begin() + std::min(count, std::ssize(rows_));
+  const auto last = rows_.begin() + int{Integer::Narrow(amount)};
   const char* order = optAlfa.Value() ? " (Alphabetical)" : "  (High to Low)";
   PrintRatios(context_, print_panel_.Chosen().copies,
               {session_.AssociationName, Trim(lblHi0.Caption()) + order, lblHi1.Caption()},

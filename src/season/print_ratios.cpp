@@ -28,7 +28,7 @@ class RatioPrint {
   }
 
   void Print() {
-    if (!job_.FitsAcross(layout_.Width())) return;
+    if (!job_.FitsAcross(layout_.Width(), PrintJob::Exactly::IsTooWide)) return;
     job_.PrintCopies([this] { return Compose(); });
   }
 

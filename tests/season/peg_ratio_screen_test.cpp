@@ -155,6 +155,59 @@ TEST_F(PegRatioScreen, PegsOfPlayersThatAreGoneMakeNoList) {
   EXPECT_EQ(Cells("grdRatio").size(), 2U);
 }
 
+TEST_F(PegRatioScreen, AListOfNobodyHasNothingToPrint) {
+  WriteResults("Winter_A Grade.qzr", {Made(99, 12, {40, 0, 0, 0, 0, 0})});
+  OpenPrinting();
+  EXPECT_EQ(Caption("optHI(0)"), "Print Entire List of 0 Peg Ratios");
+  EXPECT_EQ(Text("txtHI"), "0");
+  Do("click cmdPrintRatios");
+  EXPECT_EQ(BoxTexts(), (TextList{"You must show AMOUNT to print!    "}));
+  EXPECT_EQ(Count("printed"), 0);
+}
+
+TEST_F(PegRatioScreen, TheBarComesAlongWithTheResults) {
+  HOLDS_FOR_MODELS_ALONE("a fault stops the faces at different reads");
+  std::vector<ResultRecord> results(9000, Made(1, 5, {1, 0, 0, 0, 0, 0}));
+  WriteResults("Winter_A Grade.qzr", results);
+  Open();
+  bool part_of_it = false;
+  for (int read = 1; read <= 40 && !part_of_it; ++read) {
+    // A title that cannot be read is asked for.
+    DoAll({"forget", "input Winter 2004", "fault off", "fault read " + std::to_string(read) + " 57",
+           "pick cboResGrade =A Grade"});
+    const Json bar = Get("pbRatio");
+    EXPECT_FALSE(bar["visible"]);
+    part_of_it = bar["max"] == 3 && bar["value"] > 0 && bar["value"] < 3;
+  }
+  EXPECT_TRUE(part_of_it);
+  DoAll({"fault off", "pick cboResGrade =A Grade"});
+  EXPECT_EQ(Get("pbRatio")["value"], 3);
+}
+
+TEST_F(PegRatioScreen, AListThatCannotBeWrittenIsNotPrintedUnderTheHeadingBefore) {
+  WriteResults("Winter_B Grade.qzr", {Made(4, 12, {8, 0, 0, 0, 0, 0})});
+  WriteFile("Winter_B Grade.qzs", "\"Winter B\"\r\n");
+  OpenPrinting();
+  DoAll({"fault write 1 61", "pick cboResGrade =B Grade"});
+  EXPECT_EQ(EventsNamed("error").at(0)["number"], 61);
+  Do("click cmdPrintRatios");
+  EXPECT_EQ(Count("printed"), 0);
+  EXPECT_EQ(BoxTexts(), (TextList{"You must show AMOUNT to print!    "}));
+}
+
+TEST_F(PegRatioScreen, AnOpenPanelTakesTheAmountOfAnotherGradesList) {
+  WriteResults("Winter_B Grade.qzr", {Made(4, 12, {8, 0, 0, 0, 0, 0})});
+  WriteFile("Winter_B Grade.qzs", "\"Winter B\"\r\n");
+  Open();
+  DoAll({"pick cboResGrade =B Grade", "click cmdHiPrint", "pick cboResGrade =A Grade"});
+  EXPECT_EQ(Caption("optHI(0)"), "Print Entire List of 3 Peg Ratios");
+  EXPECT_EQ(Text("txtHI"), "3");
+  Do("click cmdPrintRatios");
+  const auto pages = PagesOf(EventsNamed("printed"));
+  ASSERT_EQ(pages.size(), 1U);
+  EXPECT_EQ(pages[0].boxes.size(), 4U);
+}
+
 TEST_F(PegRatioScreen, AListThatCannotBeWrittenIsNotOffered) {
   OpenList();
   Do("fault write 1 61");
@@ -306,6 +359,17 @@ TEST_F(PegRatioScreen, AFontThatIsTooLargeIsRefused) {
   EXPECT_EQ(BoxTexts(), (TextList{"Font is too large, please re-select.    "}));
   EXPECT_EQ(Count("killed"), 1);
   EXPECT_EQ(Count("printed"), 0);
+}
+
+// Num 360, names 1100 + 240, teams 600 + 240, legs and pegs 600 each, ratio 840: 4580 in all.
+TEST_F(PegRatioScreen, ATableThatLeavesJust300BesideItIsTooWide) {
+  OpenPrinting();
+  DoAll({"printer width 4880", "click cmdPrintRatios"});
+  EXPECT_EQ(BoxTexts(), (TextList{"Font is too large, please re-select.    "}));
+  EXPECT_EQ(Count("killed"), 1);
+  DoAll({"click cmdHiPrint", "printer width 4881", "click cmdPrintRatios"});
+  EXPECT_TRUE(BoxTexts().empty());
+  EXPECT_EQ(Count("printed"), 1);
 }
 
 TEST_F(PegRatioScreen, APrinterThatFailsIsTold) {

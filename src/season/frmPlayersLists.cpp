@@ -43,9 +43,9 @@ void frmPlayersLists::GetGrades() {
 
 void frmPlayersLists::GetTeams() {
   lstteams.Clear();
+  TakeGrade();
   OpenFile(session_, context_.channels);
   if (session_.PlayerCount == 1) return ListOnlyPlayersTeam();
-  TakeGrade();
   ListTeams();
   cmdClip.SetFocus();
 }
@@ -80,6 +80,8 @@ void frmPlayersLists::cmdClip_Click() {
   text.Line("PLAYER LIST").Line("");
   for (const std::string& line : lstteams.Lines()) text.Line(line);
   context_.platform.clipboard.SetText(text.Text());
+  // KEPT: the box says that leaving clears the clipboard, which it does not; a repair would leave
+  // those words out.
   GoodMessage(context_,
               Lines({"The Player List has been copied to the clipboard    ",
                      "and can now be pasted as text into your    ",

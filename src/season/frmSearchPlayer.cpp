@@ -59,6 +59,7 @@ void frmSearchPlayer::ShowFound() {
 
 void frmSearchPlayer::GetPlayers() {
   session_.RowCount = 0;
+  lblInfo.SetCaption("");
   OpenFile(session_, context_.channels);
   // Without an open competition there is nobody to be found.
   if (session_.PlayerFile.empty()) return TellCount();
@@ -109,6 +110,8 @@ void frmSearchPlayer::cmdClip_Click() {
     text.Row(cells, TabbedText::LastTab::Yes);
   }
   context_.platform.clipboard.SetText(text.Text());
+  // KEPT: the box says that leaving clears the clipboard, which it does not; a repair would leave
+  // those words out.
   GoodMessage(context_,
               Lines({"Your Search results   ", "have been copied to the clipboard    ",
                      "and can now be pasted as text into your    ",

@@ -112,6 +112,28 @@ TEST_F(PlayersLists, TheClipboardGetsTitleAndLines) {
             "Note: When you leave this section,    \rthe Clipboard will be cleared !");
 }
 
+TEST_F(PlayersLists, LeavingDoesNotClearTheClipboardWhateverTheBoxSaid) {
+  // KEPT: the box of the copy says that it is cleared.
+  WriteFile("Winter_A Grade.qzs", "\"Winter 2004\"\r\n");
+  Open(TwoGrades());
+  Do("click cmdClip");
+  const auto copied = EventsNamed("clipboard").back();
+  Do("click cmdExit");
+  EXPECT_EQ(Count("clipboard"), 0);
+  EXPECT_EQ(Do("clipboard")["text"], copied);
+}
+
+TEST_F(PlayersLists, AGradeThatCannotBeListedIsNotCopiedUnderAnotherOnesTitle) {
+  WriteFile("Winter_A Grade.qzs", "\"Title of A\"\r\n");
+  WriteFile("Winter_B Grade.qzs", "\"Title of B\"\r\n");
+  Open(TwoGrades());
+  DoAll({"fault open 1 70", "pick Combo1 =B Grade"});
+  EXPECT_EQ(EventsNamed("error").at(0)["number"], 70);
+  EXPECT_TRUE(Lines("lstteams").empty());
+  Do("click cmdClip");
+  EXPECT_EQ(EventsNamed("clipboard").back(), "Mid Darts\r\nTitle of B\r\nPLAYER LIST\r\n\r\n");
+}
+
 TEST_F(PlayersLists, AMissingTitleIsAskedForWhenItIsCopied) {
   Open(TwoGrades());
   Do("input Summer 2004");

@@ -142,6 +142,16 @@ TEST_F(SearchPlayer, TheClipboardGetsEveryRowWithATabBehindEachCell) {
             "Note: When you leave this section,    \rthe Clipboard will be cleared !");
 }
 
+TEST_F(SearchPlayer, LeavingDoesNotClearTheClipboardWhateverTheBoxSaid) {
+  // KEPT: the box of the copy says that it is cleared.
+  Search("mc");
+  Do("click cmdClip");
+  const auto copied = EventsNamed("clipboard").back();
+  Do("click cmdExit");
+  EXPECT_EQ(Count("clipboard"), 0);
+  EXPECT_EQ(Do("clipboard")["text"], copied);
+}
+
 TEST_F(SearchPlayer, FromTheMainMenuItLeadsBackThere) {
   Search("mc");
   EXPECT_EQ(InSession("Flag"), 1);
@@ -174,6 +184,17 @@ TEST_F(SearchPlayer, APlayerFileThatCannotBeReadIsToldAndTheWayBackStands) {
   Do("fault off");
   Do("close frmSearchPlayer");
   EXPECT_EQ(Front(), "frmDB");
+}
+
+TEST_F(SearchPlayer, ASearchThatFailsTellsNoNumberOfTheOneBefore) {
+  Search("mc");
+  EXPECT_EQ(Caption("lblInfo"), "Found 2 names containing: MC");
+  DoAll({"input smith", "fault read 1 57", "click cmdAgain"});
+  EXPECT_EQ(EventsNamed("error").at(0)["number"], 57);
+  EXPECT_EQ(Caption("lblInfo"), "");
+  EXPECT_EQ(Cells("grdShow").size(), 1U);
+  DoAll({"input-cancel", "click cmdAgain"});
+  EXPECT_EQ(Caption("lblInfo"), "Found 1 name containing: SMITH");
 }
 
 }  // namespace

@@ -23,7 +23,9 @@ constexpr const char* kLeastRows = "leastRows";
 constexpr const char* kHeadless = "headless";
 /// A property of the form: the room is parted among the columns in these shares.
 constexpr const char* kColumnShares = "columnShares";
-
+/// A property of the form: the columns are alike as long as every cell has room, and their headings
+/// stand in the middle.
+constexpr const char* kEvenColumns = "evenColumns";
 /// A property of the form: the first column counts the rows, and is one of figures.
 constexpr const char* kNumbered = "numbered";
 
@@ -113,6 +115,7 @@ void GridView::FitColumns() {
   std::vector<int> widths;
   widths.reserve(static_cast<std::size_t>(cols));
   for (int col = 0; col < cols; ++col) widths.push_back(WidthOfColumn(col));
+  if (EvenOut(widths)) return;
   int spare = table_.viewport()->width() - std::accumulate(widths.begin(), widths.end(), 0);
   const bool whole = spare >= 0;
   const int sharing = cols - first_names_;
@@ -127,6 +130,20 @@ void GridView::FitColumns() {
   }
   for (int col = 0; col < cols; ++col) table_.setColumnWidth(col, widths[AsIndex(col)]);
   FitRows(whole && !HasLineBreaks() ? RowHeights::Alike : RowHeights::AsNeeded);
+}
+
+/// Answers whether all columns have been made alike.
+bool GridView::EvenOut(const std::vector<int>& needed) {
+  const int cols = table_.columnCount();
+  const int room = table_.viewport()->width();
+  const bool even = table_.property(kEvenColumns).toBool() &&
+                    *std::max_element(needed.begin(), needed.end()) <= room / cols;
+  if (!even) return false;
+  for (int col = 0; col < cols; ++col) {
+    table_.setColumnWidth(col, room / cols + (col < room % cols ? 1 : 0));
+  }
+  FitRows(RowHeights::Alike);
+  return true;
 }
 
 bool GridView::HasLineBreaks() const {
@@ -240,7 +257,8 @@ void GridView::ShowHeading() {
   table_.horizontalHeader()->setHidden(model_.Rows() == 0 || heading_rows_ == 0);
   for (int col = 0; col < model_.Cols(); ++col) {
     auto* const item = new QTableWidgetItem(ToQt(model_.Cell(0, col)));
-    item->setTextAlignment(AlignmentOf(col));
+    item->setTextAlignment(table_.property(kEvenColumns).toBool() ? Qt::AlignCenter
+                                                                  : AlignmentOf(col));
     table_.setHorizontalHeaderItem(col, item);
   }
 }

@@ -29,6 +29,7 @@ class GridView : public CaptionedView {
   void FitColumns();
   void ShareOutColumns();
   void MakeRoomForWords(int col, const std::vector<int>& others);
+  bool EvenOut(const std::vector<int>& needed);
   enum class RowHeights { Alike, AsNeeded };
   void FitRows(RowHeights heights);
   [[nodiscard]] bool HasLineBreaks() const;

@@ -17,6 +17,7 @@ constexpr int kTotalsColumns = 12;
 
 std::vector<std::string> RowOf(const Grid& grid, int row) {
   std::vector<std::string> cells;
+  cells.reserve(static_cast<std::size_t>(grid.Cols()));
   for (int col = 0; col < grid.Cols(); ++col) cells.push_back(grid.Cell(row, col));
   return cells;
 }

@@ -7,7 +7,7 @@
 #include "session/forfeits_choice.h"
 #include "session/messages.h"
 #include "session/season.h"
-#include "stats/grid_rows.h"
+#include "ui/grid_rows.h"
 
 namespace marlowbeck {
 namespace {

@@ -8,7 +8,7 @@
 #include "session/messages.h"
 #include "session/season.h"
 #include "session/shared_procedures.h"
-#include "stats/grid_rows.h"
+#include "ui/grid_rows.h"
 #include "ui/screens.h"
 
 namespace marlowbeck {

@@ -1,6 +1,6 @@
 #include "stats/frmPMenu.h"
 #include "stats/grade_reports.h"
-#include "stats/grid_rows.h"
+#include "ui/grid_rows.h"
 
 namespace marlowbeck {
 namespace {

@@ -5,9 +5,9 @@
 #include <string>
 #include <vector>
 
+#include "data/id_index.h"
 #include "data/records.h"
 #include "data/side_file.h"
-#include "stats/id_index.h"
 
 namespace marlowbeck {
 

@@ -6,9 +6,9 @@
 #include <string_view>
 #include <vector>
 
+#include "data/id_index.h"
 #include "data/records.h"
 #include "data/side_file.h"
-#include "stats/id_index.h"
 
 namespace marlowbeck {
 

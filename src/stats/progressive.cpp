@@ -2,7 +2,7 @@
 
 #include "session/forfeits_choice.h"
 #include "stats/frmPMenu.h"
-#include "stats/grid_rows.h"
+#include "ui/grid_rows.h"
 
 namespace marlowbeck {
 

@@ -7,9 +7,9 @@
 #include <utility>
 #include <vector>
 
+#include "data/id_index.h"
 #include "data/records.h"
 #include "data/side_file.h"
-#include "stats/id_index.h"
 
 namespace marlowbeck {
 

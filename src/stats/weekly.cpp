@@ -5,8 +5,8 @@
 #include "session/season.h"
 #include "session/shared_procedures.h"
 #include "stats/frmPMenu.h"
-#include "stats/grid_rows.h"
 #include "stats/team_reports.h"
+#include "ui/grid_rows.h"
 
 namespace marlowbeck {
 namespace {

@@ -33,6 +33,15 @@ class TargetNames {
   int count_ = 0;
 };
 
+/// A folder that has gone is left for the copy to tell of.
+bool AreSame(FileSystem& files, const std::string& a, const std::string& b) {
+  try {
+    return files.AreSameFolder(a, b);
+  } catch (const RunTimeError&) {
+    return a == b;
+  }
+}
+
 }  // namespace
 
 void frmBackup::CopyClicked(CopyPane& from, CopyPane& to) {
@@ -46,7 +55,7 @@ void frmBackup::CopyClicked(CopyPane& from, CopyPane& to) {
 void frmBackup::DoCopy(CopyPane& from, CopyPane& to) {
   if (from.BuFile.Marked().empty()) {
     GoodMessage(context_, "No files selected to copy.");
-  } else if (context_.channels.Files().AreSameFolder(from.Path(), to.Path())) {
+  } else if (AreSame(context_.channels.Files(), from.Path(), to.Path())) {
     Warning(context_, "You cannot copy a file to itself !");
     UnSelect(from);
   } else if (AskToCopy(from, to)) {

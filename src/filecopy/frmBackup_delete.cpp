@@ -20,8 +20,8 @@ void frmBackup::DeleteFiles(CopyPane& pane) {
   if (names.empty()) return;
   if (DangerYN(context_, DeleteQuestion(names, pane.Path())) != kAnswerYes) return UnSelect(pane);
   FileSystem& files = context_.channels.Files();
-  files.ChangeFolder(pane.Path());
   WithBar(pane, static_cast<int>(names.size()), [&] {
+    files.ChangeFolder(pane.Path());
     picPb.Show();
     for (const std::string& name : names) {
       // KEPT: COMMAND.COM is passed over without a word, though the question counted it; a repair

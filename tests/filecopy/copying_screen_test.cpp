@@ -232,13 +232,30 @@ TEST_F(CopyingFiles, OfAFileThatHasGoneIsAnErrorAndTheListSeesIt) {
   EXPECT_EQ(Lines("BuFileS"), (TextList{"Winter.qza", "Winter_A.qzr"}));
 }
 
-TEST_F(CopyingFiles, IntoAFolderThatHasGoneIsAnError) {
+TEST_F(CopyingFiles, IntoAFolderThatHasGoneIsAnErrorOnceItWasAskedFor) {
   OpenWithStick();
   Do("pick BuFileS 0");
   DeleteFile("Stick");
-  DoAll({"click cmdBuS"});
-  EXPECT_EQ(EventsNamed("error").at(0)["number"], 76);
+  DoAll({"answer yes", "click cmdBuS"});
+  EXPECT_EQ(BoxTexts(), (TextList{Question("1 file"), "PATH NOT FOUND    "}));
   EXPECT_EQ(File("Summer.qza"), "summer");
+  EXPECT_EQ(Caption("lblPathD"), Folder().string());
+  EXPECT_EQ(Buttons('S'), "A--N--");
+}
+
+TEST_F(CopyingFiles, OutOfAFolderThatHasGoneIsAnErrorOnceItWasAskedFor) {
+  WriteFile("Stick/Spring.qza", "spring");
+  OpenWithStick();
+  Do("pick BuFileD 0");
+  DeleteFile("Stick/Spring.qza");
+  DeleteFile("Stick");
+  DoAll({"answer yes", "click cmdBuD"});
+  EXPECT_EQ(BoxTexts(),
+            (TextList{"You are about to Copy 1 file to\r" + Upper("") + "\r\rAre you Sure?",
+                      "PATH NOT FOUND    "}));
+  EXPECT_EQ(Caption("lblPathD"), Folder().string());
+  EXPECT_EQ(Marked("BuFileD"), std::vector<int>{});
+  EXPECT_EQ(Buttons('D'), "A--N--");
 }
 
 class FullDisk : public CopyingFiles {

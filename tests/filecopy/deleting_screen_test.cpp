@@ -87,6 +87,18 @@ TEST_F(DeletingFiles, OfAFileThatHasGoneIsAnError) {
   EXPECT_EQ(Lines("BuFileS"), (TextList{"Summer.qza", "Winter_A.qzr"}));
 }
 
+TEST_F(DeletingFiles, OutOfAFolderThatHasGoneIsAnErrorAndThePaneGoesUp) {
+  WriteFile("Stick/Spring.qza", "spring");
+  OpenWithStick();
+  Do("pick BuFileD 0");
+  DeleteFile("Stick/Spring.qza");
+  DeleteFile("Stick");
+  DoAll({"answer yes", "click cmdDeleteD"});
+  EXPECT_EQ(EventsNamed("error").at(0)["number"], 76);
+  EXPECT_EQ(Caption("lblPathD"), Folder().string());
+  EXPECT_EQ(Buttons('D'), "A--N--");
+}
+
 class CopierFolders : public CopierTest {};
 
 TEST_F(CopierFolders, AreDeletedWhenTheyAreEmptyAndThePaneGoesUp) {

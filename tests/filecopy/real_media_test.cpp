@@ -31,6 +31,8 @@ class SmallDisk {
     if (mounted_) umount2(Path().c_str(), MNT_DETACH);
     mounted_ = false;
   }
+  /// Empty, where it was.
+  void Return() { mounted_ = mount("tmpfs", Path().c_str(), "tmpfs", 0, "size=128k") == 0; }
   void Go() {
     Unmount();
     fs::remove(Path());
@@ -102,7 +104,7 @@ TEST_F(RealMedia, ADiskThatCannotBeWrittenRefusesTheCopy) {
 TEST_F(RealMedia, ADiskThatIsPulledOutIsAnErrorAndThePaneStandsElsewhere) {
   club.Do("pick BuFileS 0");
   disk.Go();
-  club.Do("click cmdBuS");
+  club.DoAll({"answer yes", "click cmdBuS"});
   EXPECT_EQ(club.EventsNamed("error").at(0)["number"], 76);
   club.DoAll({"pick BuFileS 1", "click cmdUSS"});
   EXPECT_TRUE(fs::is_directory(club.Caption("lblPathD")));
@@ -128,6 +130,20 @@ TEST_F(RealMedia, ADriveThatWentBehindTheListIsWarnedOfAtTheFirstClick) {
   EXPECT_EQ(club.BoxTexts(), Names{"Drive " + gone + " is not available!    "});
   EXPECT_EQ(club.Lines("BuDriveD").at(static_cast<std::size_t>(club.Index("BuDriveD"))), "/");
   EXPECT_EQ(club.Caption("lblPathD"), "/");
+}
+
+TEST_F(RealMedia, ADriveIsWarnedOfAtEachClickWhileItIsOutAndOpensOnceItIsBack) {
+  club.DoAll({"pick BuDriveD =/", "focus BuDirS"});
+  disk.Unmount();
+  const std::string pick = "pick BuDriveD =" + disk.Path();
+  for (int i = 0; i < 2; ++i) {
+    club.Do(pick);
+    EXPECT_EQ(club.BoxTexts(), Names{"Drive " + disk.Path() + " is not available!    "});
+  }
+  disk.Return();
+  club.Do(pick);
+  EXPECT_EQ(club.BoxTexts(), Names{});
+  EXPECT_EQ(club.Caption("lblPathD"), disk.Path());
 }
 
 TEST_F(RealMedia, ADriveWhoseFolderIsLeftIsNotReadyEither) {

@@ -99,6 +99,14 @@ void RefuseProtected(const fs::path& path) {
   }
 }
 
+/// A pipe or a device would block for ever.
+void RefusePipes(const fs::path& path) {
+  std::error_code error;
+  if (fs::exists(path, error) && !fs::is_regular_file(path, error)) {
+    throw RunTimeError(ErrorNumber::BadFileName);
+  }
+}
+
 /// Puts a file in the place of one on another volume: by a copy beside it.
 void ReplaceAcrossVolumes(const fs::path& source, const fs::path& target) {
   fs::path copy = target;
@@ -151,9 +159,7 @@ std::unique_ptr<File> RealFileSystem::Open(const std::string& path, OpenMode mod
   const fs::path located = Located(path);
   std::error_code error;
   if (fs::is_directory(located, error)) throw RunTimeError(ErrorNumber::PathFileAccess);
-  if (fs::exists(located, error) && !fs::is_regular_file(located, error)) {
-    throw RunTimeError(ErrorNumber::BadFileName);  // a pipe or device would block for ever
-  }
+  RefusePipes(located);
   return OpenSystemFile(located, mode);
 }
 
@@ -239,6 +245,7 @@ void RealFileSystem::Copy(const std::string& from, const std::string& to) {
   if (fs::is_directory(source, error) || fs::is_directory(target, error)) {
     throw RunTimeError(ErrorNumber::PathFileAccess);
   }
+  RefusePipes(source);
   CopySystemFile(source, target);
 }
 

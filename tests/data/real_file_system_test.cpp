@@ -1,5 +1,6 @@
 #include "data/real_file_system.h"
 
+#include <sys/stat.h>
 #include <unistd.h>
 
 #include <chrono>
@@ -136,6 +137,12 @@ TEST_F(RealFiles, NamesThatAreNoneAreBad) {
 }
 
 TEST_F(RealFiles, ADeviceIsNoFile) { EXPECT_ERROR(52, Open("/dev/full", OpenMode::ReadWrite)); }
+
+TEST_F(RealFiles, APipeIsNotWaitedForByACopy) {
+  ASSERT_EQ(mkfifo(folder.In("pipe").c_str(), 0600), 0);
+  EXPECT_ERROR(52, files.Copy("pipe", "copy"));
+  EXPECT_FALSE(folder.Has("copy"));
+}
 
 TEST_F(RealFiles, AFolderInThePlaceOfAFileIsAnAccessError) {
   files.MakeFolder("Winter.qza");

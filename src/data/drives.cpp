@@ -57,9 +57,7 @@ std::vector<std::string> MountPointsIn(std::istream& mounts) {
     const bool can_be_named = !point.empty() && Utf8FromCp1252(point) == utf8;
     if (can_be_named && point != kRoot && !IsTheSystems(point)) points.push_back(std::move(point));
   }
-  std::sort(points.begin(), points.end(), [](const std::string& a, const std::string& b) {
-    return std::pair(UpperCase(a), a) < std::pair(UpperCase(b), b);
-  });
+  std::sort(points.begin(), points.end(), ComesBefore);
   points.erase(std::unique(points.begin(), points.end()), points.end());
   points.insert(points.begin(), kRoot);
   return points;

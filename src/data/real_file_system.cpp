@@ -275,9 +275,8 @@ std::vector<FolderEntry> RealFileSystem::List(const std::string& folder) {
   for (const fs::directory_entry& entry : entries) {
     list.push_back({TextOfPath(entry.path().filename()), entry.is_directory(error)});
   }
-  std::sort(list.begin(), list.end(), [](const FolderEntry& a, const FolderEntry& b) {
-    return std::pair(UpperCase(a.name), a.name) < std::pair(UpperCase(b.name), b.name);
-  });
+  std::sort(list.begin(), list.end(),
+            [](const FolderEntry& a, const FolderEntry& b) { return ComesBefore(a.name, b.name); });
   return list;
 }
 

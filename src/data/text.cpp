@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <array>
+#include <compare>
 #include <cstdint>
 #include <utility>
 
@@ -99,6 +100,13 @@ std::string UpperCase(std::string_view text) {
 bool EqualsIgnoringCase(std::string_view a, std::string_view b) {
   return std::equal(a.begin(), a.end(), b.begin(), b.end(),
                     [](char x, char y) { return UpperByte(x) == UpperByte(y); });
+}
+
+bool ComesBefore(std::string_view a, std::string_view b) {
+  const auto byte = [](char letter) { return static_cast<unsigned char>(UpperByte(letter)); };
+  const auto order = std::lexicographical_compare_three_way(
+      a.begin(), a.end(), b.begin(), b.end(), [&](char x, char y) { return byte(x) <=> byte(y); });
+  return std::is_eq(order) ? a < b : std::is_lt(order);
 }
 
 std::string FixedWidth(std::string_view text, std::size_t width) {

@@ -18,6 +18,10 @@ namespace marlowbeck {
 /// True when both are the same letters in any case, by code page 1252.
 [[nodiscard]] bool EqualsIgnoringCase(std::string_view a, std::string_view b);
 
+/// Whether a name stands before another one in a list, without regard to case; names that differ
+/// in case alone stand by their bytes.
+[[nodiscard]] bool ComesBefore(std::string_view a, std::string_view b);
+
 /// Exactly `width` bytes: cut when longer, filled with blanks when shorter.
 [[nodiscard]] std::string FixedWidth(std::string_view text, std::size_t width);
 

@@ -19,14 +19,6 @@ void Say(Label& label, std::string_view words, Meaning meaning) {
   label.SetMeaning(meaning);
 }
 
-/// Those that have come since stand below the others, and those that have gone keep their lines, so
-/// that none moves away under the pointer that is about to pick it.
-void TakeNewDrives(DriveList& list, FileSystem& files) {
-  for (const std::string& drive : files.Drives()) {
-    if (list.Find(drive) < 0) list.AddLine(drive);
-  }
-}
-
 /// Throws DeviceUnavailable for a drive that has gone, though the folder where it stood may be
 /// left.
 void ExpectReady(FileSystem& files, const std::string& drive) {
@@ -39,7 +31,7 @@ void ExpectReady(FileSystem& files, const std::string& drive) {
 }  // namespace
 
 void frmBackup::Connect(CopyPane& pane, CopyPane& other) {
-  pane.BuDrive.GotFocus = [this, &pane] { TakeNewDrives(pane.BuDrive, context_.channels.Files()); };
+  pane.BuDrive.GotFocus = [&pane] { pane.BuDrive.TakeNew(); };
   pane.BuDrive.Change = [this, &pane] { DriveChanged(pane); };
   pane.BuDir.Change = [this, &pane] { FolderChanged(pane); };
   pane.BuDir.GotFocus = [this, &other] { FocusTaken(other); };

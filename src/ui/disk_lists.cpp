@@ -77,6 +77,12 @@ void DriveList::Refresh() {
   if (Index() < 0) drive_.clear();
 }
 
+void DriveList::TakeNew() {
+  for (const std::string& drive : Files().Drives()) {
+    if (Find(drive) < 0) AddLine(drive);
+  }
+}
+
 void DriveList::IndexAssigned() {
   DiskList::IndexAssigned();
   const std::string drive = Index() < 0 ? std::string() : Line(Index());
@@ -121,10 +127,7 @@ void FileList::SetPattern(std::string_view pattern) {
 
 void FileList::Include(const std::string& name) {
   std::vector<std::string> lines = Lines();
-  const auto comes_before = [](const std::string& a, const std::string& b) {
-    return std::pair(UpperCase(a), a) < std::pair(UpperCase(b), b);
-  };
-  const auto place = std::lower_bound(lines.begin(), lines.end(), name, comes_before);
+  const auto place = std::lower_bound(lines.begin(), lines.end(), name, ComesBefore);
   const bool is_listed = place != lines.end() && *place == name;
   if (!is_listed && MatchesPattern(name, pattern_)) lines.insert(place, name);
   SetLines(lines);

@@ -46,6 +46,9 @@ class DriveList : public DiskList {
   void SetDrive(std::string_view path);
   /// The same for what is on show already: fires nothing. A path on no drive makes none current.
   void ShowDriveOf(std::string_view path);
+  /// Those that have come since stand below the others, and those that have gone keep their lines,
+  /// so that none moves away under the pointer that is about to pick it.
+  void TakeNew();
   /// The current drive stays current as long as it is there.
   void Refresh() override;
 

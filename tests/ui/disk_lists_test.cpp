@@ -123,6 +123,23 @@ TEST_F(DriveListTest, ADriveThatIsStillThereStaysCurrentWhereverItStands) {
   EXPECT_EQ(changes, 0);
 }
 
+TEST_F(DriveListTest, NewDrivesComeBelowAndNoneMovesForOneThatHasGone) {
+  list.SetDrive("/media/stick");
+  const std::vector<std::string> before = list.Lines();
+  const int line = list.Index();
+  int changes = 0;
+  list.Change = [&] { ++changes; };
+  disk.drives = {"/", "/a", "/media/stick"};
+  list.TakeNew();
+  std::vector<std::string> lines = before;
+  lines.emplace_back("/a");
+  EXPECT_EQ(list.Lines(), lines);
+  EXPECT_EQ(list.Index(), line);
+  list.TakeNew();
+  EXPECT_EQ(list.Lines(), lines) << "each once";
+  EXPECT_EQ(changes, 0);
+}
+
 TEST_F(DriveListTest, TheDriveOfWhatIsOnShowBecomesCurrentInSilence) {
   int told = 0;
   list.Change = [&] { ++told; };

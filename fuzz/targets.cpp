@@ -140,6 +140,7 @@ void Words(Input input) {
   }
   Must(Cp1252FromUtf8(Utf8FromCp1252(text)) == text, "the code page comes back");
   Must(Cp1252FromUtf8(text).size() <= text.size(), "no character is made two");
+  Must(NameOfText(TextOfName(text)) == text, "the name of a file comes back");
   Must(UpperCase(UpperCase(text)) == UpperCase(text), "capitals stay");
 }
 

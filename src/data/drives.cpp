@@ -52,10 +52,10 @@ std::vector<std::string> MountPointsIn(std::istream& mounts) {
     std::string device;
     std::string column;
     std::istringstream(line) >> device >> column;
-    const std::string utf8 = Plain(column);
-    std::string point = Cp1252FromUtf8(utf8);
-    const bool can_be_named = !point.empty() && Utf8FromCp1252(point) == utf8;
-    if (can_be_named && point != kRoot && !IsTheSystems(point)) points.push_back(std::move(point));
+    std::string point = TextOfName(Plain(column));
+    if (!point.empty() && point != kRoot && !IsTheSystems(point)) {
+      points.push_back(std::move(point));
+    }
   }
   std::sort(points.begin(), points.end(), ComesBefore);
   points.erase(std::unique(points.begin(), points.end()), points.end());
@@ -80,7 +80,7 @@ std::vector<std::string> DrivesOfMachine() {
   std::vector<std::string> drives = MountPointsIn(mounts);
   std::erase_if(drives, [](const std::string& point) {
     std::error_code error;
-    return !std::filesystem::is_directory(Utf8FromCp1252(point), error);
+    return !std::filesystem::is_directory(NameOfText(point), error);
   });
   return drives;
 }

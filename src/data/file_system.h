@@ -36,8 +36,9 @@ struct FolderEntry {
   bool is_folder = false;
 };
 
-/// The only door to the disk. Paths are texts of code page 1252; a bare name lies in the current
-/// folder; names are found without regard to case. Failures throw RunTimeError.
+/// The only door to the disk. Paths are texts of code page 1252, with escapes for the characters
+/// that it has no place for; a bare name lies in the current folder; names are found without regard
+/// to case. Failures throw RunTimeError.
 class FileSystem {
  public:
   virtual ~FileSystem() = default;

@@ -20,8 +20,8 @@ namespace {
 namespace fs = std::filesystem;
 
 fs::path PathOfText(const std::string& text) {
-  const std::string utf8 = Utf8FromCp1252(text);
-  return {std::u8string(utf8.begin(), utf8.end())};
+  const std::string name = NameOfText(text);
+  return {std::u8string(name.begin(), name.end())};
 }
 
 #ifdef _WIN32
@@ -41,13 +41,11 @@ std::vector<fs::directory_entry> EntriesOf(const fs::path& folder, std::error_co
   return entries;
 }
 
-/// Whether a name on the disk is the wanted one in any case. A name with characters that a text
-/// cannot hold is none: two such names may read alike.
-bool IsInAnyCase(const std::string& found, const std::string& wanted_utf8) {
+/// Whether a name on the disk is the wanted one in any case.
+bool IsInAnyCase(const std::string& found, const std::string& wanted) {
   // A letter takes as much room in either case, so that most names are told apart unread.
-  if (found.size() != wanted_utf8.size()) return false;
-  const std::string text = Cp1252FromUtf8(found);
-  return EqualsIgnoringCase(text, Cp1252FromUtf8(wanted_utf8)) && Utf8FromCp1252(text) == found;
+  if (found.size() != wanted.size()) return false;
+  return EqualsIgnoringCase(TextOfName(found), TextOfName(wanted));
 }
 
 #ifdef _WIN32
@@ -122,7 +120,7 @@ void ReplaceAcrossVolumes(const fs::path& source, const fs::path& target) {
 
 std::string TextOfPath(const std::filesystem::path& path) {
   const std::u8string utf8 = path.u8string();
-  return Cp1252FromUtf8(std::string(utf8.begin(), utf8.end()));
+  return TextOfName(std::string(utf8.begin(), utf8.end()));
 }
 
 std::string FileNameOf(const std::string& path) {

@@ -44,7 +44,7 @@ class RealFileSystem : public FileSystem {
   std::filesystem::path current_;
 };
 
-/// A path of the machine as a text of code page 1252.
+/// A path of the machine as a text, as TextOfName has it.
 [[nodiscard]] std::string TextOfPath(const std::filesystem::path& path);
 
 }  // namespace marlowbeck

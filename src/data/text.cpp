@@ -17,6 +17,16 @@ constexpr std::array<std::uint16_t, 32> kUpperControls = {
 
 constexpr std::uint32_t kNoCharacter = 0xFFFFFFFF;
 
+constexpr std::uint32_t kLastCharacter = 0x10FFFF;
+constexpr std::uint32_t kReplacement = 0xFFFD;
+
+/// What an escape begins with, and the digits behind it. Numbers from kGarbled on stand for a byte
+/// that is part of no character.
+constexpr char kEscape = '\x81';
+constexpr std::string_view kHex = "0123456789ABCDEF";
+constexpr std::size_t kEscapeDigits = 6;
+constexpr std::uint32_t kGarbled = kLastCharacter + 1;
+
 /// The smallest character that takes so many bytes of UTF-8.
 constexpr std::array<std::uint32_t, 5> kSmallest = {0, 0, 0x80, 0x800, 0x10000};
 
@@ -43,7 +53,12 @@ void AppendUtf8(std::string& out, std::uint32_t code) {
     out += static_cast<char>(0xC0 | (code >> 6));
     out += static_cast<char>(0x80 | (code & 0x3F));
   } else {
-    out += static_cast<char>(0xE0 | (code >> 12));
+    if (code < 0x10000) {
+      out += static_cast<char>(0xE0 | (code >> 12));
+    } else {
+      out += static_cast<char>(0xF0 | (code >> 18));
+      out += static_cast<char>(0x80 | ((code >> 12) & 0x3F));
+    }
     out += static_cast<char>(0x80 | ((code >> 6) & 0x3F));
     out += static_cast<char>(0x80 | (code & 0x3F));
   }
@@ -69,7 +84,8 @@ std::uint32_t TakeCharacter(std::string_view& text) {
     whole = (byte & 0xC0) == 0x80;
     code = (code << 6) | (byte & 0x3FU);
   }
-  whole = whole && code >= kSmallest[length];  // no shorter form of the same character
+  // A shorter form of the same character would do, or there is none of that number.
+  whole = whole && code >= kSmallest[length] && code <= kLastCharacter;
   text.remove_prefix(whole ? length : 1);
   return whole ? code : kNoCharacter;
 }
@@ -79,6 +95,39 @@ char ByteOf(std::uint32_t code) {
   const auto* const place = std::find(kUpperControls.begin(), kUpperControls.end(), code);
   return place == kUpperControls.end() ? '?'
                                        : static_cast<char>(0x80 + (place - kUpperControls.begin()));
+}
+
+std::uint32_t CodeOf(char character) {
+  const auto byte = static_cast<unsigned char>(character);
+  return byte >= 0x80 && byte <= 0x9F ? kUpperControls[byte - 0x80U] : byte;
+}
+
+bool IsHexAhead(std::string_view text) {
+  const std::string_view digits = text.substr(0, kEscapeDigits);
+  return digits.size() == kEscapeDigits && digits.find_first_not_of(kHex) == std::string_view::npos;
+}
+
+bool BeginsWithEscape(std::string_view text) {
+  return text.front() == kEscape && IsHexAhead(text.substr(1));
+}
+
+std::string Escape(std::uint32_t code) {
+  std::string escape(1 + kEscapeDigits, kEscape);
+  for (std::size_t i = kEscapeDigits; i > 0; --i, code >>= 4) escape[i] = kHex[code & 0xF];
+  return escape;
+}
+
+std::uint32_t CodeOfEscape(std::string_view escape) {
+  std::uint32_t code = 0;
+  for (const char digit : escape.substr(1)) {
+    code = (code << 4) | static_cast<std::uint32_t>(kHex.find(digit));
+  }
+  return code;
+}
+
+/// UTF-8 holds neither halves of a pair nor bytes that are part of no character.
+bool CanBeShown(std::uint32_t code) {
+  return code <= kLastCharacter && (code < 0xD800 || code > 0xDFFF);
 }
 
 }  // namespace
@@ -132,10 +181,7 @@ std::string Lines(std::initializer_list<std::string_view> lines) {
 std::string Utf8FromCp1252(std::string_view text) {
   std::string result;
   result.reserve(text.size());
-  for (const char character : text) {
-    const auto byte = static_cast<unsigned char>(character);
-    AppendUtf8(result, byte >= 0x80 && byte <= 0x9F ? kUpperControls[byte - 0x80U] : byte);
-  }
+  for (const char character : text) AppendUtf8(result, CodeOf(character));
   return result;
 }
 
@@ -144,6 +190,70 @@ std::string Cp1252FromUtf8(std::string_view text) {
   result.reserve(text.size());
   while (!text.empty()) result += ByteOf(TakeCharacter(text));
   return result;
+}
+
+std::string TextOfName(std::string_view name) {
+  std::string text;
+  text.reserve(name.size());
+  while (!name.empty()) {
+    const auto lead = static_cast<unsigned char>(name.front());
+    const std::uint32_t code = TakeCharacter(name);
+    const char byte = ByteOf(code);
+    if (code == kNoCharacter) {
+      text += Escape(kGarbled + lead);
+    } else if (CodeOf(byte) != code || (byte == kEscape && IsHexAhead(name))) {
+      text += Escape(code);
+    } else {
+      text += byte;
+    }
+  }
+  return text;
+}
+
+std::string NameOfText(std::string_view text) {
+  std::string name;
+  name.reserve(text.size());
+  for (const std::string_view character : CharactersOf(text)) {
+    const std::uint32_t code =
+        character.size() == 1 ? CodeOf(character.front()) : CodeOfEscape(character);
+    if (code > kLastCharacter) {
+      name += static_cast<char>(code - kGarbled);
+    } else {
+      AppendUtf8(name, code);
+    }
+  }
+  return name;
+}
+
+std::string ShownText(std::string_view text) {
+  if (text.find(kEscape) == std::string_view::npos) return Utf8FromCp1252(text);
+  std::string shown;
+  for (const std::string_view character : CharactersOf(text)) {
+    const std::uint32_t code =
+        character.size() == 1 ? CodeOf(character.front()) : CodeOfEscape(character);
+    AppendUtf8(shown, CanBeShown(code) ? code : kReplacement);
+  }
+  return shown;
+}
+
+std::string WithoutEscapes(std::string_view text) {
+  std::string plain;
+  plain.reserve(text.size());
+  for (const std::string_view character : CharactersOf(text)) {
+    plain += character.size() == 1 ? character.front() : '?';
+  }
+  return plain;
+}
+
+std::vector<std::string_view> CharactersOf(std::string_view text) {
+  std::vector<std::string_view> characters;
+  characters.reserve(text.size());
+  while (!text.empty()) {
+    const std::size_t length = BeginsWithEscape(text) ? 1 + kEscapeDigits : 1;
+    characters.push_back(text.substr(0, length));
+    text.remove_prefix(length);
+  }
+  return characters;
 }
 
 }  // namespace marlowbeck

@@ -3,6 +3,7 @@
 #include <initializer_list>
 #include <string>
 #include <string_view>
+#include <vector>
 
 namespace marlowbeck {
 
@@ -37,5 +38,22 @@ namespace marlowbeck {
 
 /// UTF-8 as bytes of code page 1252; what has no place there, and garbled UTF-8, becomes "?".
 [[nodiscard]] std::string Cp1252FromUtf8(std::string_view text);
+
+// A disk may hold names with characters that the code page has no place for, and names that are no
+// UTF-8. So that each of them is a text of its own, such a character stands in it as an escape: a
+// byte that the page leaves open and six hexadecimal digits. Escapes are the same in capitals.
+
+/// The text that stands for a name of the disk; TextOfName and NameOfText undo each other.
+[[nodiscard]] std::string TextOfName(std::string_view name);
+[[nodiscard]] std::string NameOfText(std::string_view text);
+
+/// A text as people see it, in UTF-8: an escape as its character.
+[[nodiscard]] std::string ShownText(std::string_view text);
+
+/// A text with "?" for every escape, as records and boxes hold it.
+[[nodiscard]] std::string WithoutEscapes(std::string_view text);
+
+/// The characters of a text one by one, an escape being one.
+[[nodiscard]] std::vector<std::string_view> CharactersOf(std::string_view text);
 
 }  // namespace marlowbeck

@@ -90,7 +90,7 @@ void PanelView::ReadKind(ControlState& state) const {
   if (const auto* const group = qobject_cast<const QGroupBox*>(Widget())) {
     state.caption = FromMnemonicText(group->title());
   } else if (const auto* const label = qobject_cast<const QLabel*>(Widget())) {
-    state.caption = FromQt(label->text());
+    state.caption = NameFromQt(label->text());
   } else if (Buddy() != nullptr) {
     state.caption = FromMnemonicText(Buddy()->text());
   } else {
@@ -120,7 +120,7 @@ void LabelView::ShowKind() {
   label_.setAccessibleName(Spoken(GetControl().Caption()));
 }
 
-void LabelView::ReadKind(ControlState& state) const { state.caption = FromQt(label_.text()); }
+void LabelView::ReadKind(ControlState& state) const { state.caption = NameFromQt(label_.text()); }
 
 ButtonView::ButtonView(Control& control, QAbstractButton* button, Windows& windows)
     : View(control, button, windows), button_(*button) {

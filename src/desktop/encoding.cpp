@@ -6,13 +6,18 @@
 namespace marlowbeck {
 
 QString ToQt(std::string_view text) {
-  QString result = QString::fromStdString(Utf8FromCp1252(text));
+  QString result = QString::fromStdString(ShownText(text));
   return result.replace('\r', '\n');
 }
 
 std::string FromQt(const QString& text) {
   QString copy = text;
   return Cp1252FromUtf8(copy.replace('\n', '\r').toStdString());
+}
+
+std::string NameFromQt(const QString& text) {
+  QString copy = text;
+  return TextOfName(copy.replace('\n', '\r').toStdString());
 }
 
 QString ToMnemonicText(std::string_view caption) {

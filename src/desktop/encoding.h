@@ -14,6 +14,8 @@ namespace marlowbeck {
 
 [[nodiscard]] QString ToQt(std::string_view text);
 [[nodiscard]] std::string FromQt(const QString& text);
+/// The same with escapes for what the code page has no place for: what names on show stand for.
+[[nodiscard]] std::string NameFromQt(const QString& text);
 
 /// A caption for a widget that reads "&" as the mark of a mnemonic: one that marks none is doubled.
 [[nodiscard]] QString ToMnemonicText(std::string_view caption);

@@ -100,7 +100,7 @@ int ListView::CurrentLine() const {
 
 void ListView::ReadKind(ControlState& state) const {
   auto& lines = state.lines.emplace();
-  for (int i = 0; i < list_.count(); ++i) lines.push_back(FromQt(list_.item(i)->text()));
+  for (int i = 0; i < list_.count(); ++i) lines.push_back(NameFromQt(list_.item(i)->text()));
   std::vector<int> selected;
   for (const QModelIndex& index : list_.selectionModel()->selectedIndexes()) {
     selected.push_back(index.row());
@@ -113,7 +113,7 @@ void ListView::ReadKind(ControlState& state) const {
     state.selected = selected;
   }
   if (state.kind == Kind::Folders || state.kind == Kind::Files) {
-    state.path = FromQt(list_.accessibleDescription());
+    state.path = NameFromQt(list_.accessibleDescription());
   }
 }
 

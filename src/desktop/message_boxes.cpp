@@ -15,6 +15,7 @@ namespace marlowbeck {
 namespace {
 
 constexpr const char* kTopic = "topic";
+constexpr const char* kAsksName = "asks_name";
 
 struct Look {
   BoxStyle style;
@@ -100,6 +101,7 @@ InputDialog::InputDialog(const InputBoxRequest& request, QWidget* parent,
       ok_(new QPushButton("OK", this)),
       cancel_(new QPushButton("Cancel", this)) {
   setWindowTitle(ToQt(request.title));
+  setProperty(kAsksName, request.is_name);
   prompt_->setTextFormat(Qt::PlainText);
   prompt_->setBuddy(entry_);
   entry_->setAccessibleName(Spoken(request.prompt));
@@ -132,6 +134,8 @@ std::optional<int> InputDialog::HelpTopic() const {
   return help_ == nullptr ? std::nullopt : std::optional(help_->property(kTopic).toInt());
 }
 
+bool InputDialog::AsksName() const { return property(kAsksName).toBool(); }
+
 MessageBoxes::MessageBoxes(std::function<void()> before, std::function<void(int topic)> help)
     : before_(std::move(before)), help_(std::move(help)) {}
 
@@ -152,7 +156,9 @@ std::string MessageBoxes::ShowInput(const InputBoxRequest& request) {
   const PlainPointer pointer;
   InputDialog box(request, QApplication::activeWindow(), help_);
   Run(box);
-  return box.result() == QDialog::Accepted ? FromQt(box.Entry().text()) : std::string();
+  if (box.result() != QDialog::Accepted) return {};
+  const QString text = box.Entry().text();
+  return request.is_name ? NameFromQt(text) : FromQt(text);
 }
 
 }  // namespace marlowbeck

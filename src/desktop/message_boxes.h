@@ -24,6 +24,7 @@ class InputDialog : public QDialog {
   [[nodiscard]] QPushButton& CancelButton() const { return *cancel_; }
   /// Of the Help button; nothing where there is none.
   [[nodiscard]] std::optional<int> HelpTopic() const;
+  [[nodiscard]] bool AsksName() const;
 
  private:
   QLabel* prompt_;

@@ -3,6 +3,7 @@
 #include <string_view>
 #include <utility>
 
+#include "data/text.h"
 #include "drive/command_table.h"
 #include "drive/names.h"
 #include "drive/refusal.h"
@@ -39,7 +40,8 @@ Action ReadType(World& world, Arguments& arguments) {
 int LineEqualTo(const Control& control, std::string_view text) {
   const auto* const list = dynamic_cast<const LineHolder*>(&control);
   if (list == nullptr) throw Refusal(control.Name() + " has no lines");
-  const int line = list->Find(text);
+  int line = list->Find(text);
+  if (line < 0) line = list->Find(WithoutEscapes(text));  // as it stands in a record
   if (line < 0) throw Refusal(control.Name() + " has no line \"" + std::string(text) + "\"");
   return line;
 }
@@ -50,7 +52,7 @@ ActionReader ControlAndLine(Verb verb) {
     Action action = On(verb, TakeControl(arguments, world.GetScreens()));
     Arguments ahead = arguments;
     if (ahead.Word("a line").starts_with('=')) {
-      const std::string text = arguments.Rest();
+      const std::string text = arguments.RestAsName();
       action.numbers = {LineEqualTo(*action.control, text.substr(text.find('=') + 1))};
     } else {
       action.numbers = {arguments.Number("the line", 0)};

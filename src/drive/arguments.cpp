@@ -30,7 +30,7 @@ std::optional<std::string> ReadScriptLine(std::string_view line) {
   if (line.ends_with('\n')) line.remove_suffix(1);
   if (line.ends_with('\r')) line.remove_suffix(1);
   if (line.empty() || line.front() == '#') return std::nullopt;
-  return Cp1252FromUtf8(line);
+  return TextOfName(line);
 }
 
 std::optional<int> WholeNumber(std::string_view word) {
@@ -70,20 +70,24 @@ Date Arguments::Day(std::string_view what) {
   return *date;
 }
 
-std::string Arguments::Rest() {
+std::string Arguments::RestAsName() {
   if (rest_.starts_with(' ')) rest_.remove_prefix(1);
   return std::string(std::exchange(rest_, {}));
 }
 
-std::string Arguments::Typed() {
-  std::string text = Rest();
-  for (const char letter : text) {
+std::string Arguments::Rest() { return WithoutEscapes(RestAsName()); }
+
+std::string Arguments::TypedName() {
+  std::string text = RestAsName();
+  for (const char letter : WithoutEscapes(text)) {
     if (IsWritten(letter)) continue;
     Refuse("there is no key that writes character " +
            std::to_string(static_cast<unsigned char>(letter)) + " into a box");
   }
   return text;
 }
+
+std::string Arguments::Typed() { return WithoutEscapes(TypedName()); }
 
 void Arguments::Finish() const {
   if (!AtEnd()) {

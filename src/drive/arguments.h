@@ -9,8 +9,9 @@
 
 namespace marlowbeck {
 
-/// A line of a script as the program's own text: from UTF-8 to code page 1252, without the line
-/// end. Nothing for a line that is passed over: an empty one or a comment.
+/// A line of a script as the program's own text: from UTF-8 to code page 1252, with escapes for
+/// what has no place there, and without the line end. Nothing for a line that is passed over: an
+/// empty one or a comment.
 [[nodiscard]] std::optional<std::string> ReadScriptLine(std::string_view line);
 
 /// What stands in a script line, taken off from the front. All that cannot be read is a Refusal
@@ -29,9 +30,14 @@ class Arguments {
   /// A whole number, no smaller than `least`.
   int Number(std::string_view what, int least);
   Date Day(std::string_view what);
-  /// All that follows the one blank after the last word, blanks included; may be empty.
+  /// All that follows the one blank after the last word, blanks included, as a name of the disk;
+  /// may be empty.
+  std::string RestAsName();
+  /// The same without escapes.
   std::string Rest();
-  /// The same as what is typed into a box. Refuses what no key writes there.
+  /// The same as what is typed into a box, as a name or without escapes. Refuses what no key writes
+  /// there.
+  std::string TypedName();
   std::string Typed();
   /// Refuses when anything is left.
   void Finish() const;

@@ -12,6 +12,6 @@ namespace marlowbeck {
 using Json = nlohmann::ordered_json;
 
 /// A text of the program as JSON has it.
-[[nodiscard]] inline Json TextAsJson(std::string_view text) { return Utf8FromCp1252(text); }
+[[nodiscard]] inline Json TextAsJson(std::string_view text) { return ShownText(text); }
 
 }  // namespace marlowbeck

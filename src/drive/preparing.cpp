@@ -20,7 +20,7 @@ void PrepareMessage(World& world, Arguments& arguments, Json& /*answer*/) {
 }
 
 void PrepareInput(World& world, Arguments& arguments, Json& /*answer*/) {
-  world.answers.inputs.Add(arguments.Typed());
+  world.answers.inputs.Add(arguments.TypedName());
 }
 
 void PrepareFile(World& world, Arguments& arguments, Json& /*answer*/) {

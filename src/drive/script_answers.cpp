@@ -3,6 +3,8 @@
 #include <algorithm>
 #include <vector>
 
+#include "data/text.h"
+
 namespace marlowbeck {
 namespace {
 
@@ -67,6 +69,7 @@ std::optional<std::string> ScriptAnswers::ToInput(const InputBoxRequest& seen) {
   bool unexpected = false;
   std::optional<std::string> answer = inputs.Take(unexpected);
   if (unexpected) CountUnexpected(seen.title + '\n' + seen.prompt);
+  if (answer && !seen.is_name) answer = WithoutEscapes(*answer);
   Json input = {{"prompt", TextAsJson(seen.prompt)},
                 {"title", TextAsJson(seen.title)},
                 {"default", TextAsJson(seen.default_text)}};

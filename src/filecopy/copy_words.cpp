@@ -24,9 +24,13 @@ std::string SelectedWords(int files) {
 }
 
 std::string ShortenedPath(std::string_view path) {
-  if (path.size() <= kPathRoom) return std::string(path);
-  return std::string(path.substr(0, kPathHead)) + kPathGap +
-         std::string(path.substr(path.size() - kPathTail));
+  const std::vector<std::string_view> characters = CharactersOf(path);
+  if (characters.size() <= kPathRoom) return std::string(path);
+  const auto at = [&](std::size_t character) {
+    return static_cast<std::size_t>(characters[character].data() - path.data());
+  };
+  return std::string(path.substr(0, at(kPathHead))) + kPathGap +
+         std::string(path.substr(at(characters.size() - kPathTail)));
 }
 
 std::string CopyQuestion(int files, std::string_view folder, bool overwriting) {

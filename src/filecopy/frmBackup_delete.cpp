@@ -59,7 +59,7 @@ void frmBackup::DeleteFolder(CopyPane& pane) {
 /// What is selected in the other pane stays so.
 void frmBackup::NewFolder(CopyPane& pane, CopyPane& other) {
   const std::string name = Trim(context_.platform.boxes.Input(
-      {NewFolderPrompt(pane.Path()), "Marlowbeck", "New Folder", {}}));
+      {NewFolderPrompt(pane.Path()), "Marlowbeck", "New Folder", {}, true}));
   if (name.empty()) return;
   context_.channels.Files().MakeFolder(PathIn(pane.Path(), name));
   pane.Refresh();

@@ -39,6 +39,7 @@ struct InputBoxRequest {
   std::string title;
   std::string default_text;
   std::optional<int> help_topic;
+  bool is_name = false;  ///< a file's name is asked for, whose characters may all be escapes
 };
 
 /// Modal boxes. They count themselves, since a click that calls one up on its way is lost.

@@ -9,6 +9,7 @@
 
 #include <gtest/gtest.h>
 
+#include "data/text.h"
 #include "tests/data/expect_error.h"
 #include "tests/data/temporary_folder.h"
 
@@ -105,12 +106,24 @@ TEST_F(RealFiles, TheSpellingAskedForComesFirstWhereTheDiskHoldsSeveral) {
   EXPECT_EQ(Read("A.txt"), "upper");
 }
 
-TEST_F(RealFiles, ANameThatNoTextCanHoldIsNotFoundUnderOneThatReadsAlike) {
+TEST_F(RealFiles, ANameBeyondTheCodePageIsFoundUnderItsOwnTextAlone) {
   folder.Write("\u0142.txt", "first");
-  EXPECT_EQ(files.List(folder.Path())[0].name, "?.txt");
+  folder.Write("\u0143.txt", "second");
+  folder.Write("\xFF.txt", "third");
+  const auto listed = files.List(folder.Path());
+  ASSERT_EQ(listed.size(), 3U);
+  EXPECT_EQ(Read(listed[0].name), "first");
+  EXPECT_EQ(Read(listed[1].name), "second");
+  EXPECT_EQ(Read(listed[2].name), "third");
   EXPECT_ERROR(53, Open("?.txt", OpenMode::Read));
-  Write("?.txt", "second");
+  Write("?.txt", "fourth");
   EXPECT_EQ(folder.Read("\u0142.txt"), "first");
+}
+
+TEST_F(RealFiles, LettersBeyondTheCodePageDoNotHideTheCaseOfOthers) {
+  folder.Write("\u0141OD.qza", "players");
+  EXPECT_EQ(Read(TextOfName("\u0141od.QZA")), "players");
+  EXPECT_ERROR(53, Open(TextOfName("\u0142OD.qza"), OpenMode::Read));
 }
 
 TEST_F(RealFiles, AMissingFileIsNotFoundAndAMissingFolderIsNoPath) {

@@ -1,6 +1,7 @@
 #include "data/text.h"
 
 #include <set>
+#include <vector>
 
 #include <gtest/gtest.h>
 
@@ -93,6 +94,104 @@ TEST(Lines, AreJoinedByOneCarriageReturn) {
   EXPECT_EQ(Lines({"a", "", "b"}), "a\r\rb");
   EXPECT_EQ(Lines({"a"}), "a");
   EXPECT_EQ(Lines({"", "a"}), "\ra");
+}
+
+TEST(ComesBefore, GoesByLettersInAnyCaseAndThenByBytes) {
+  EXPECT_TRUE(ComesBefore("a", "B"));
+  EXPECT_TRUE(ComesBefore("B", "c"));
+  EXPECT_FALSE(ComesBefore("B", "a"));
+  EXPECT_TRUE(ComesBefore("A", "a"));
+  EXPECT_FALSE(ComesBefore("a", "A"));
+  EXPECT_FALSE(ComesBefore("a", "a"));
+  EXPECT_TRUE(ComesBefore("a", "A.x"));
+  EXPECT_TRUE(ComesBefore("a_", "ab") == ComesBefore("A_", "AB"));
+  EXPECT_TRUE(ComesBefore("z", "\xE9")) << "letters beyond ASCII follow";
+  EXPECT_TRUE(ComesBefore("\xE9", "\xC9t")) << "in any case too";
+}
+
+TEST(Names, OfTheCodePageAreTheirText) {
+  EXPECT_EQ(TextOfName("Pr\xC3\xA9-\xE2\x82\xAC [1]?.qza"), "Pr\xE9-\x80 [1]?.qza");
+  EXPECT_EQ(NameOfText("Pr\xE9-\x80 [1]?.qza"), "Pr\xC3\xA9-\xE2\x82\xAC [1]?.qza");
+}
+
+TEST(Names, HaveAnEscapeForWhatTheCodePageHasNoPlaceFor) {
+  EXPECT_EQ(TextOfName("\xC5\x81\xC3\xB3"),
+            "\x81"
+            "000141"
+            "\xF3");
+  EXPECT_EQ(TextOfName("\xF0\x9F\x8E\xAF"),
+            "\x81"
+            "01F3AF");
+  EXPECT_EQ(TextOfName("a\xFF"),
+            "a\x81"
+            "1100FF")
+      << "no UTF-8";
+}
+
+TEST(Names, ComeBackWhateverTheyAre) {
+  const std::vector<std::string> names = {
+      "\xC5\x81\xC3\xB3"
+      "d\xC5\xBA.qza",
+      "\xE6\x97\xA5\xE6\x9C\xAC",
+      "\xF0\x9F\x8E\xAF",
+      "\xFF\xFE",
+      "\xC3",
+      "\xE2\x82.txt",
+      "\xED\xA0\x80",
+      "\xF4\x90\x80\x80",
+      "\xC0\xAF",
+      "\xC2\x81",
+      "\xC2\x81"
+      "000041",
+      "\xC2\x81"
+      "000081000081",
+      "\xC2\x81"
+      "00041",
+      "??",
+      ""};
+  std::set<std::string> texts;
+  for (const std::string& name : names) {
+    EXPECT_EQ(NameOfText(TextOfName(name)), name);
+    texts.insert(TextOfName(name));
+  }
+  EXPECT_EQ(texts.size(), names.size());
+  EXPECT_EQ(NameOfText(AllBytes()), Utf8FromCp1252(AllBytes()));
+}
+
+TEST(Names, AreTheSameTextInCapitals) {
+  const std::string text = TextOfName("\xC5\x82\xE6\x97\xA5");
+  EXPECT_EQ(UpperCase(text), text);
+}
+
+TEST(Names, AreSeenAsTheyAre) {
+  EXPECT_EQ(ShownText(TextOfName("\xC5\x81\xC3\xB3"
+                                 "d")),
+            "\xC5\x81\xC3\xB3"
+            "d");
+  EXPECT_EQ(ShownText(TextOfName("a\xFF")), "a\xEF\xBF\xBD");
+  EXPECT_EQ(ShownText(TextOfName("\xED\xA0\x80")), "\xEF\xBF\xBD") << "half of a pair";
+  EXPECT_EQ(ShownText(AllBytes()), Utf8FromCp1252(AllBytes()));
+}
+
+TEST(Names, WithoutEscapesHaveQuestionMarks) {
+  EXPECT_EQ(WithoutEscapes(TextOfName("\xC5\x81\xC3\xB3"
+                                      "d\xFF")),
+            "?\xF3"
+            "d?");
+  EXPECT_EQ(WithoutEscapes("plain \xE9"), "plain \xE9");
+}
+
+TEST(Names, HaveACharacterForAnEscape) {
+  EXPECT_EQ(CharactersOf(TextOfName("a\xC5\x81"
+                                    "b"))
+                .size(),
+            3U);
+  EXPECT_EQ(CharactersOf("\x81"
+                         "00")
+                .size(),
+            3U)
+      << "no escape";
+  EXPECT_EQ(CharactersOf("").size(), 0U);
 }
 
 }  // namespace

@@ -23,6 +23,12 @@ TEST(Encoding, LettersBeyondAsciiAreTheirOwn) {
   EXPECT_EQ(FromQt(QString::fromUtf8("Zoë Žáček €")), "Zo\xEB \x8E\xE1?ek \x80");
 }
 
+TEST(Encoding, NamesAreSeenAsTheyAreAndReadBack) {
+  const QString name = QString::fromUtf8("Žáček 日本.qza");
+  EXPECT_EQ(ToQt(NameFromQt(name)), name);
+  EXPECT_EQ(NameFromQt("plain"), "plain");
+}
+
 TEST(Captions, AMnemonicKeepsItsMark) {
   EXPECT_EQ(ToMnemonicText("&Open"), QString("&Open"));
   EXPECT_EQ(ToMnemonicText("E&xit"), QString("E&xit"));

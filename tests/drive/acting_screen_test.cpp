@@ -108,6 +108,23 @@ TEST_F(Acting, TypeAloneEmptiesTheBox) {
   }
 }
 
+TEST_F(Acting, TypeHasAQuestionMarkForALetterBeyondTheProgramsPage) {
+  Do("type txtName \u0141\u00F3d\u017A");
+  EXPECT_EQ(Text("txtName"), "?\u00F3d?");
+}
+
+TEST_F(Acting, PickTakesALineWhoseLettersBeyondTheProgramsPageWereTyped) {
+  OnDo([](Workbench& bench) {
+    const char* const as_kept =
+        "?\xF3"
+        "d?";
+    bench.lstOne.AddLine(as_kept);
+  });
+  DoAll({"click cmdDo", "pick lstOne =\u0141\u00F3d\u017A"});
+  const Json list = Get("lstOne");
+  EXPECT_EQ(list["lines"][list["index"].get<std::size_t>()], "?\u00F3d?");
+}
+
 TEST_F(Acting, TypeTakesLettersOfTheProgramsPage) {
   Do("type txtName M\xC3\xBCller");
   EXPECT_EQ(Text("txtName"), "M\xC3\xBCller");

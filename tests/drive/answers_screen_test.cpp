@@ -81,6 +81,13 @@ TEST_F(Answers, WithAButtonThatTheBoxLacksAreUsedUpAndToldAsUnexpected) {
   EXPECT_EQ(Waiting()["answer"], 0);
 }
 
+TEST_F(Answers, OfAnInputBoxThatAsksForNoNameHaveTheLettersOfTheProgram) {
+  AskForText(46);
+  Do("input \u0141\u00F3d\u017A");
+  EXPECT_EQ(Event()["input"]["answer"], "?\u00F3d?");
+  EXPECT_EQ(Answered(), "?\u00F3d?");
+}
+
 TEST_F(Answers, OfAnInputBoxAreTextsBlanksIncluded) {
   AskForText(46);
   DoAll({"input  4 teams ", "input", "input-cancel"});

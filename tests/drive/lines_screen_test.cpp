@@ -19,6 +19,9 @@ TEST(ScriptLineReading, TakesTheLineEndOffAndKeepsTheBlanks) {
 
 TEST(ScriptLineReading, TurnsUtf8IntoTheProgramsBytes) {
   EXPECT_EQ(ReadScriptLine("input M\xC3\xBCller \xE2\x82\xAC"), "input M\xFCller \x80");
+  EXPECT_EQ(ReadScriptLine("pick C =\u0141"),
+            "pick C =\x81"
+            "000141");
 }
 
 TEST_F(ScriptLine, OfAnUnknownCommandIsRefusedByName) {

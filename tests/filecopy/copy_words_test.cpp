@@ -2,6 +2,8 @@
 
 #include <gtest/gtest.h>
 
+#include "data/text.h"
+
 namespace marlowbeck {
 namespace {
 
@@ -51,6 +53,14 @@ TEST(ShortenedPath, KeepsAPathThatHasRoom) {
   EXPECT_EQ(ShortenedPath("C:\\Darts"), "C:\\Darts");
   const std::string fifty = "/" + std::string(49, 'x');
   EXPECT_EQ(ShortenedPath(fifty), fifty);
+}
+
+TEST(ShortenedPath, CountsALetterBeyondTheCodePageOnce) {
+  std::string letters;
+  for (int i = 0; i < 49; ++i) letters += "\u0142";
+  EXPECT_EQ(ShortenedPath(TextOfName("/" + letters)), TextOfName("/" + letters));
+  EXPECT_EQ(ShortenedPath(TextOfName("/x" + letters)),
+            TextOfName("/x\u0142  ...  " + letters.substr(2 * 9)));
 }
 
 TEST(ShortenedPath, ShowsTheFirstThreeAndTheLastForty) {

@@ -258,6 +258,24 @@ TEST_F(CopyingFiles, OutOfAFolderThatHasGoneIsAnErrorOnceItWasAskedFor) {
   EXPECT_EQ(Buttons('D'), "A--N--");
 }
 
+TEST_F(CopyingFiles, WithNamesBeyondTheCodePageKeepsThem) {
+  const std::string first = "\u0141\u00F3d\u017A.qza";
+  const std::string second = "\u0143\u00F3d\u017A.qza";
+  WriteFile(first, "first");
+  WriteFile(second, "second");
+  WriteFile("Stick/" + second, "old");
+  OpenWithStick();
+  EXPECT_EQ(Lines("BuFileD"), TextList{second});
+  DoAll({"pick BuFileS =" + second, "answer yes", "answer yes", "click cmdBuS"});
+  EXPECT_EQ(BoxTexts().at(1),
+            second + " already exists in\r" + PathOf("Stick") + "\r\rDo you wish to replace it?");
+  EXPECT_EQ(File("Stick/" + second), "second");
+  EXPECT_FALSE(HasFile("Stick/" + first));
+  DoAll({"pick BuFileS =" + first, "answer yes", "click cmdBuS"});
+  EXPECT_EQ(File("Stick/" + first), "first");
+  EXPECT_EQ(Lines("BuFileD"), (TextList{first, second}));
+}
+
 class FullDisk : public CopyingFiles {
  protected:
   static constexpr const char* kFull =

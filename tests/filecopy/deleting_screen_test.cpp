@@ -99,6 +99,17 @@ TEST_F(DeletingFiles, OutOfAFolderThatHasGoneIsAnErrorAndThePaneGoesUp) {
   EXPECT_EQ(Buttons('D'), "A--N--");
 }
 
+TEST_F(DeletingFiles, WithNamesThatReadAlikeTakesTheOneThatIsMarked) {
+  WriteFile("\u0141.qza", "first");
+  WriteFile("\u0143.qza", "second");
+  Open();
+  DoAll({"pick BuFileS =\u0143.qza", "answer yes", "click cmdDeleteS"});
+  EXPECT_EQ(BoxTexts(), TextList{"You are about to delete \u0143.QZA from\r" + Upper("") +
+                                 "\r\rAre you Sure?"});
+  EXPECT_TRUE(HasFile("\u0141.qza"));
+  EXPECT_FALSE(HasFile("\u0143.qza"));
+}
+
 class CopierFolders : public CopierTest {};
 
 TEST_F(CopierFolders, AreDeletedWhenTheyAreEmptyAndThePaneGoesUp) {
@@ -187,6 +198,15 @@ TEST_F(CopierFolders, ThatAreNewLeaveTheOtherPanesSelection) {
   EXPECT_EQ(Text("txtNumFileD"), "2  Files selected.");
   EXPECT_EQ(Buttons('D'), "AUC-D-");
   EXPECT_EQ(Lines("BuDirD"), (TextList{"..", "Stick", "Week 7"}));
+}
+
+TEST_F(CopierFolders, AreMadeByNamesBeyondTheCodePageAndOpened) {
+  Open();
+  DoAll({"input \u0141\u00F3d\u017A", "click cmdNewS"});
+  EXPECT_TRUE(HasFile("\u0141\u00F3d\u017A"));
+  Do("dblpick BuDirS =\u0141\u00F3d\u017A");
+  EXPECT_EQ(Get("BuDirS")["path"], PathOf("\u0141\u00F3d\u017A"));
+  EXPECT_EQ(Caption("lblPathS"), PathOf("\u0141\u00F3d\u017A"));
 }
 
 TEST_F(CopierFolders, WithoutANameAreNotMade) {

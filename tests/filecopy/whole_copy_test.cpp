@@ -174,13 +174,15 @@ TEST_F(WholeCopy, IntoAFolderThatHasGoneHasNoPath) {
 
 TEST_F(WholeCopy, WorksWithNamesOfEveryKind) {
   const std::string longest = std::string(251, 'x') + ".qza";
-  for (const std::string& name : {longest, std::string("two words [1] (copy) 100%.qza"),
-                                  std::string("Pr\xC3\xA9-\xC3\x9C.qza")}) {
+  for (const std::string& name :
+       {longest, std::string("two words [1] (copy) 100%.qza"),
+        std::string("Pr\xC3\xA9-\xC3\x9C.qza"), std::string("\u0141\u00F3d\u017A \u65E5\u672C.qza"),
+        std::string("no UTF-8 \xFF.qza")}) {
     folder.Write("from/" + name, name);
-    CopyWhole(files, folder.In("from/") + Cp1252FromUtf8(name), folder.In("to"));
+    CopyWhole(files, folder.In("from/") + TextOfName(name), folder.In("to"));
     EXPECT_EQ(folder.Read("to/" + name), name);
   }
-  EXPECT_EQ(Target().size(), 3U);
+  EXPECT_EQ(Target().size(), 5U);
 }
 
 TEST_F(WholeCopy, OfALinkIsAFileOfItsOwn) {

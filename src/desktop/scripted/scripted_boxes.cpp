@@ -12,12 +12,12 @@ namespace {
 void ClickOn(QWidget& widget) { ClickMouse(widget, widget.rect().center()); }
 
 MessageBoxRequest Seen(const QMessageBox& box) {
-  return {FromQt(box.text()), FromQt(box.windowTitle()), StyleOf(box)};
+  return {NameFromQt(box.text()), FromQt(box.windowTitle()), StyleOf(box)};
 }
 
 InputBoxRequest Seen(const InputDialog& box) {
-  return {FromQt(box.Prompt().text()), FromQt(box.windowTitle()), FromQt(box.Entry().text()),
-          box.HelpTopic()};
+  return {NameFromQt(box.Prompt().text()), FromQt(box.windowTitle()), FromQt(box.Entry().text()),
+          box.HelpTopic(), box.AsksName()};
 }
 
 }  // namespace

@@ -3,6 +3,7 @@
 #include <stdexcept>
 #include <utility>
 
+#include <QLayout>
 #include <QPushButton>
 #include <QScreen>
 
@@ -18,6 +19,31 @@ std::unique_ptr<QWidget> MakeForm(const std::string& screen) {
   if (form == Forms().end()) throw std::logic_error("there is no form for " + screen);
   return form->second();
 }
+
+/// What goes and what comes change places in one step: a window that had to hold both for a moment
+/// would stay as large as that.
+class OneStep {
+ public:
+  explicit OneStep(QWidget& window) : window_(window), layout_(window.layout()) {
+    if (layout_ != nullptr) layout_->setEnabled(false);
+  }
+  ~OneStep() {
+    if (layout_ == nullptr) return;
+    // What lies within first, or the window would reckon with the room that it had.
+    const QList<QWidget*> inner = window_.findChildren<QWidget*>();
+    for (auto widget = inner.rbegin(); widget != inner.rend(); ++widget) {
+      if (QLayout* const layout = (*widget)->layout()) layout->activate();
+    }
+    layout_->setEnabled(true);
+    layout_->activate();
+  }
+  OneStep(const OneStep&) = delete;
+  OneStep& operator=(const OneStep&) = delete;
+
+ private:
+  QWidget& window_;
+  QLayout* layout_;
+};
 
 }  // namespace
 
@@ -72,7 +98,10 @@ void ScreenWindow::BringUpToDate() {
   const QString title = ToQt(screen_->Title());
   if (window_->windowTitle() != title) window_->setWindowTitle(title);
   window_->setEnabled(screen_->Enabled());
-  for (const auto& view : views_) view->BringUpToDate();
+  {
+    const OneStep step(*window_);
+    for (const auto& view : views_) view->BringUpToDate();
+  }
   MarkDefault();
 }
 

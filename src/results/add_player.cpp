@@ -33,7 +33,7 @@ void frmResults::cmdAddSave0_Click() {
   if (std::ranges::any_of(entries, [](const TextBox* box) { return box->Text().empty(); })) {
     Warning(context_, Lines({"Surname & First name", "must be completed."}));
     txtAddSn0.SetFocus();
-    // KEPT: a refused player leaves the teams within reach behind the panel; a repair would leave
+    // KEPT: a refused player leaves the teams within reach beside the panel; a repair would leave
     // them disabled until it closes.
     fraTeams.Enable();
     return;

@@ -65,10 +65,10 @@ TEST_P(Layout, CutsNothingAndCoversNothing) {
   for (std::string line; std::getline(script, line) && !HasFatalFailure();) Play(line);
 }
 
-/// Panels that take each other's place, where a handler ends half-way.
-class PanelsInOnePlace : public testing::Test {
+/// Panels that take each other's place, where more of them are up than a person needs.
+class PanelsOfTheScoreSheets : public testing::Test {
  protected:
-  PanelsInOnePlace() {
+  PanelsOfTheScoreSheets() {
     club_.DoAll({"click imgSheets", "pick cboResGrade =A Grade", "date Cal 2004-03-31",
                  "click cmdGotoResults", "pick cboResTeam =Bluebells"});
   }
@@ -82,7 +82,7 @@ class PanelsInOnePlace : public testing::Test {
   WindowClub club_;
 };
 
-TEST_F(PanelsInOnePlace, CoverNothingAfterAFailure) {
+TEST_F(PanelsOfTheScoreSheets, CoverNothingAfterAFailure) {
   int failed = 0;
   for (int operation = 1; operation <= 12; ++operation) {
     club_.Do("fault any " + std::to_string(operation) + " 57");
@@ -95,21 +95,53 @@ TEST_F(PanelsInOnePlace, CoverNothingAfterAFailure) {
   EXPECT_GT(failed, 3);
 }
 
-TEST_F(PanelsInOnePlace, LetASheetWithoutARecordBeLeft) {
+TEST_F(PanelsOfTheScoreSheets, LetASheetWithoutARecordBeLeft) {
   club_.DoAll({"pick lstFinished 0", "click cmdResultsCancel"});
   auto results = club_.Results("Winter_A Grade.qzr");
   for (ResultRecord& result : results) result.Team = "Elsewhere";
   club_.WriteResults("Winter_A Grade.qzr", results);
   club_.Do("pick lstFinished 0");
   ASSERT_TRUE(club_.Shown("fraResults") && club_.Shown("fraResControls"));
-  // The sheet lies on top, so that one can get away from it.
-  const QString faults = Faults();
-  for (const char* const name : {"txtAgg", "chkFF", "cmdSave", "cmdResultsCancel"}) {
-    EXPECT_FALSE(faults.contains(name)) << faults.toStdString();
-  }
+  EXPECT_EQ(Faults(), QString());
   club_.DoAll({"click chkFF", "click cmdResultsCancel"});
   EXPECT_EQ(Faults(), QString());
   club_.Do("click cmdLeaveResults");
+}
+
+TEST_F(PanelsOfTheScoreSheets, StandBesideThatOfARefusedPlayer) {
+  club_.DoAll({"click panAddNames", "click cmdAddSave0"});
+  for (const char* line : {"pick lstFinished 0", "click cmdResultsCancel", "click cmdChangeGrade",
+                           "date Cal 2004-04-07", "click cmdGotoResults", "pick lstResPlayers 0",
+                           "click cmdAddCancel0"}) {
+    EXPECT_TRUE(club_.Do(line).value("ok", false)) << line;
+    EXPECT_EQ(Faults(), QString()) << line;
+  }
+  EXPECT_TRUE(club_.Shown("fraResults") && club_.Shown("fraResControls"));
+}
+
+TEST_F(PanelsOfTheScoreSheets, StandBesideThatOfAnotherOpposition) {
+  club_.DoAll({"click cmdChangeGrade", "date Cal 2004-04-07", "click cmdGotoResults"});
+  for (const char* line : {"click panChangeOpp", "click cmdChangeGrade", "date Cal 2004-04-07",
+                           "click cmdGotoResults", "pick lstResPlayers 0"}) {
+    EXPECT_TRUE(club_.Do(line).value("ok", false)) << line;
+    EXPECT_EQ(Faults(), QString()) << line;
+  }
+  EXPECT_TRUE(club_.Shown("fraReDoOpp") && club_.Shown("fraTeams"));
+}
+
+TEST_F(PanelsOfTheScoreSheets, FitIntoTheSmallestWindowWhereGradeAndDateIsChosenAgain) {
+  club_.Do("click cmdChangeGrade");
+  EXPECT_EQ(Faults(), QString());
+  EXPECT_EQ(WindowOf("frmResults")->size(), kSmall);
+}
+
+TEST_F(PanelsOfTheScoreSheets, ThatChangePlacesLeaveTheWindowAsLargeAsItIs) {
+  EXPECT_EQ(Faults(), QString());
+  for (const char* line : {"pick lstFinished 0", "click cmdResultsCancel", "click panAddNames",
+                           "click cmdAddCancel0", "click cmdChangeGrade", "click cmdGotoResults"}) {
+    EXPECT_TRUE(club_.Do(line).value("ok", false)) << line;
+    EXPECT_EQ(WindowOf("frmResults")->size(), kSmall) << line;
+  }
 }
 
 INSTANTIATE_TEST_SUITE_P(Of, Layout, testing::ValuesIn(Scripts()), [](const auto& script) {

@@ -134,22 +134,6 @@ TEST_F(Looks, ACommandOfAPanelThatIsAwayIsNotTheOneThatEnterGoesTo) {
   EXPECT_FALSE(IsDefault("cmdAddSave"));
 }
 
-TEST_F(Looks, ASheetOverThePanelOfANewPlayerHidesIt) {
-  const auto picture = [this] {
-    club_.DoAll({"pick lstResPlayers 0", "focus chkFF"});
-    QWidget& sheet = club_.Find("fraResults");
-    QWidget& window = *WindowOf("frmResults");
-    const QPoint corner = sheet.mapTo(&window, QPoint(0, 0));
-    return window.grab(QRect(corner, sheet.size())).toImage();
-  };
-  club_.DoAll({"click imgSheets", "date Cal 2004-04-07", "click cmdGotoResults"});
-  const QImage alone = picture();
-  // A refused player leaves the teams within reach behind the panel.
-  club_.DoAll({"click cmdResultsCancel", "click panAddNames", "click cmdAddSave0"});
-  EXPECT_TRUE(club_.Find("panResAddPlayer").isVisible());
-  EXPECT_EQ(picture(), alone);
-}
-
 TEST_F(Looks, AComboThatIsHeldHasNothingToDropDown) {
   club_.Do("click imgPlayers");
   EXPECT_FALSE(HasNoArrow("cboAddTm"));

@@ -199,7 +199,7 @@ TEST_F(AddPlayer, EachOfTheFourBoxesMustHoldSomething) {
   EXPECT_EQ(Count("sound"), 0);
 }
 
-TEST_F(AddPlayer, ARefusalLeavesTheTeamsWithinReachBehindThePanel) {
+TEST_F(AddPlayer, ARefusalLeavesTheTeamsWithinReachBesideThePanel) {
   Open();
   Do("click cmdAddSave0");
   ExpectOpen();
@@ -207,6 +207,27 @@ TEST_F(AddPlayer, ARefusalLeavesTheTeamsWithinReachBehindThePanel) {
   Do("pick lstResPlayers =Hill,  Al");
   EXPECT_TRUE(Shown("fraResults"));
   EXPECT_TRUE(Shown("panResAddPlayer"));
+}
+
+TEST_F(AddPlayer, ARefusedPanelIsWorkedOnBesideTheSheetOfAPickedPlayer) {
+  Open();
+  DoAll({"click cmdAddSave0", "pick lstResPlayers =Hill,  Al"});
+  TypeInto({{"txtAgg", "300"},
+            {"txtAddSn0", "Hall"},
+            {"txtAddFn0", "Joy"},
+            {"txtAddTm0", "Hawks"},
+            {"txtAddGrd0", "A Grade"}});
+  EXPECT_EQ(Focus(), "frmResults.txtAddGrd0");
+  Do("click cmdAddSave0");
+  EXPECT_EQ(League().size(), 17U);
+  EXPECT_FALSE(Shown("panResAddPlayer"));
+  // The sheet stays, and beside it what the panel had taken the place of.
+  EXPECT_TRUE(Shown("fraResults"));
+  EXPECT_TRUE(Shown("fraResControls"));
+  EXPECT_EQ(Text("txtAgg"), "300");
+  DoAll({"click chkFF", "click cmdMakeWorkDate", "click cmdSave"});
+  ASSERT_EQ(Saved().size(), 1U);
+  EXPECT_EQ(Saved()[0].ID, 11);
 }
 
 TEST_F(AddPlayer, BlanksAreTakenForANameAsTyped) {

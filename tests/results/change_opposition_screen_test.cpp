@@ -280,6 +280,10 @@ TEST_F(ChangeOpposition, AnotherGradeMeanwhileShowsTheTeamsBesideThePanel) {
   DoAll({"click cmdChangeGrade", "pick cboResGrade =B Grade", "click cmdGotoResults"});
   EXPECT_TRUE(Shown("fraTeams"));
   EXPECT_TRUE(Shown("fraReDoOpp"));
+  // Both are worked.
+  DoAll({"pick cboReDoOpp 0", "pick cboResTeam 1", "pick lstResPlayers 0", "click SSCommand3"});
+  ExpectClosed();
+  EXPECT_TRUE(Shown("fraResults"));
 }
 
 }  // namespace

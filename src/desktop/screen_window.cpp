@@ -3,6 +3,7 @@
 #include <stdexcept>
 #include <utility>
 
+#include <QBoxLayout>
 #include <QLayout>
 #include <QPushButton>
 #include <QScreen>
@@ -20,6 +21,19 @@ std::unique_ptr<QWidget> MakeForm(const std::string& screen) {
   return form->second();
 }
 
+/// A property of a form's row: a side of it on which nothing stands leaves its room to the others.
+constexpr const char* kSides = "sides";
+
+void ShareOutSides(const QWidget& window) {
+  for (QHBoxLayout* const row : window.findChildren<QHBoxLayout*>()) {
+    if (!row->property(kSides).toBool()) continue;
+    for (int i = 0; i < row->count(); ++i) {
+      QLayout* const side = row->itemAt(i)->layout();
+      row->setStretch(i, side != nullptr && !side->isEmpty() ? 1 : 0);
+    }
+  }
+}
+
 /// What goes and what comes change places in one step: a window that had to hold both for a moment
 /// would stay as large as that.
 class OneStep {
@@ -29,6 +43,7 @@ class OneStep {
   }
   ~OneStep() {
     if (layout_ == nullptr) return;
+    ShareOutSides(window_);
     // What lies within first, or the window would reckon with the room that it had.
     const QList<QWidget*> inner = window_.findChildren<QWidget*>();
     for (auto widget = inner.rbegin(); widget != inner.rend(); ++widget) {

@@ -48,6 +48,9 @@ void frmPMenu::DoHighest() {
   for (Command* command : {&cmdProgress, &cmdCombine}) command->Hide();
   lstHiDates.Clear();
   OfferList(false);
+  // What other screens and reports leave in these is neither a progressive list nor rows of one.
+  session_.Flag = 0;
+  session_.RowCount = 0;
   fraPikHi.Show();
   fraFontPick.Show();
   picPrintHI.Hide();

@@ -169,6 +169,20 @@ TEST_F(CombinedGrades, KeepAskingTheListOfOneGradeWhetherThereIsAnything) {
   ExpectOneGrade();
 }
 
+TEST_F(CombinedGrades, AskNoListOfAnEarlierReportWhetherThereIsAnything) {
+  LayClubOfTwoGrades();
+  DeleteFile("Winter_A.qzr");
+  OpenList();
+  Do("pick cboHiGrade =B");
+  ASSERT_EQ(InSession("RowCount"), 2);
+  DoAll({"click cmdHiMenu", "click Image1", "click cmdCombine"});
+  EXPECT_TRUE(Shown("lblNoneFound"));
+  EXPECT_FALSE(Shown("fraHi"));
+  EXPECT_FALSE(Shown("cmdReDoAvgs"));
+  EXPECT_TRUE(Enabled("cboHiGrade"));
+  EXPECT_FALSE(HasFile("Combine.qz3"));
+}
+
 TEST_F(CombinedGrades, OfPlayersThatAreAllGoneHaveNoRowsAndNothingToCopy) {
   LayClubOfTwoGrades();
   WritePlayers("Winter.qza",

@@ -279,6 +279,18 @@ TEST_F(HighestLists, AFirstGradeWithoutResultsLeavesThePanelForAnotherOne) {
   EXPECT_TRUE(Enabled("cmdHiPrint"));
 }
 
+// A visit to the ladder leaves 1 in the Flag, which would make the first list a progressive one.
+TEST_F(HighestLists, OpenWithOneDateWhateverAnotherScreenLeftInTheFlag) {
+  LayClub();
+  DoAll({"click imgLadder", "click cmdGotoResults", "click cmdExit"});
+  ASSERT_EQ(InSession("Flag"), 1);
+  OpenList();
+  EXPECT_EQ(Cells("grdHI"), (Rows{{"No.", "Player", "Team", "Avg"},
+                                  {"1", "Clark, Ed", "Hawks", "30.00"},
+                                  {"2", "Archer, Jo", "Rovers", "25.25"}}));
+  EXPECT_EQ(InSession("Flag"), 0);
+}
+
 TEST_F(HighestLists, WithoutAGradeThereIsNothingToPickAndNothingIsAsked) {
   LayClub();
   OpenList();

@@ -154,8 +154,8 @@ void frmPMenu::Image6_Click() {
   fraFontPick.Show();
   // Last, so that another team can be picked when the first one's night cannot be shown.
   DoWeekly();
-  // KEPT: on the way in the tables are shown though the first team may have no night; a repair would
-  // leave them hidden.
+  // KEPT: on the way in the tables are shown though the first team may have no night; a repair
+  // would leave them hidden.
   fraWkProg.Show();
 }
 

@@ -10,6 +10,8 @@ std::vector<Date> WithoutRepeats(const std::vector<Date>& dates) {
   return distinct;
 }
 
+// KEPT: a step back from before all dates goes ahead to the first of them, and one forward from
+// behind all goes back to the last; a repair would stay.
 std::optional<DateStep> StepForward(const std::vector<Date>& dates, Date from) {
   if (dates.empty()) return std::nullopt;
   const auto last = dates.end() - 1;

@@ -44,6 +44,8 @@ void frmLadder::cmdSaveConfig_Click() {
   const auto number = [](const TextBox& box) { return Integer::Narrow(Val(box.Text())); };
   const LadderRules rules = {number(cfgWin), number(cfgLoss), number(cfgDraw),
                              CInt(cfgFinals.Text()), number(cfgGames)};
+  // KEPT: nothing comes of the number of teams in the finals but that it is kept; a repair would
+  // mark those teams in the table.
   context_.GoToWorkingFolder();
   WriteLadderRules(context_.channels, session_.LadderConfigFile, rules);
   context_.channels.CloseAll();

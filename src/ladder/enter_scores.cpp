@@ -144,6 +144,8 @@ void frmLadder::AfterRecording() {
   BlankEntry();
   if (lstTeams.Count() == 0) lblHomeAway.SetCaption(kNoTeams);
   lstTeams.SetFocus();
+  // KEPT: the one team that is left cannot be picked for its bye until the panel is filled anew; a
+  // repair would leave the list enabled.
   if (lstTeams.Count() == 1) lstTeams.Disable();
 }
 

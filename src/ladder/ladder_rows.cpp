@@ -158,6 +158,8 @@ std::string AdjustText(int adjust) { return (adjust > 0 ? "+" : "") + std::to_st
 
 void SortLadder(LadderRows& rows) {
   SortRows(rows, [](const LadderRow& a, const LadderRow& b) { return a.Points >= b.Points; });
+  // KEPT: teams level on points and percentage stand as the two passes leave them, which need not
+  // be by their names; a repair would order them by name.
   // KEPT: teams level on points are ordered by the percentage rounded to a whole number, so that
   // 94.4 and 93.6 tie; a repair would compare the percentages themselves.
   SortRows(rows, [](const LadderRow& a, const LadderRow& b) {

@@ -74,7 +74,9 @@ void frmLadder::SavePen() {
   context_.channels.CloseAll();
 }
 
-/// Into the team's first match of the date. Without one nothing is stored, and nothing said.
+// KEPT: points for a team without a match on the date are dropped without a word; a repair would
+// say so.
+/// Into the team's first match of the date.
 void frmLadder::StorePenalty(double points) {
   Channels& channels = context_.channels;
   LadderRecord record;

@@ -80,6 +80,8 @@ void frmLadder::cmdClipLadder_Click() {
   GetSeason(context_);
   context_.platform.clipboard.SetText(
       LadderClipboardText(session_, session_.LadderDate, ShownTab()));
+  // KEPT: the box says that leaving clears the clipboard, which it does not; a repair would leave
+  // those words out.
   GoodMessage(
       context_,
       Lines({"The Game results and Premiership Ladder    ",

@@ -63,6 +63,8 @@ bool frmLadder::ScoresAreInRange(double home, double away) {
   return true;
 }
 
+// KEPT: a bye is a draw of nothing against nobody, asked about and counted as any other; a repair
+// would mark it as a bye.
 /// A bye has no away team, whatever was picked before.
 void frmLadder::WriteMatch() {
   LadderRecord match;

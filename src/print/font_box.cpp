@@ -65,6 +65,8 @@ void FontBox::Take(const FontChoice& chosen) {
   Session& session = context_.session;
   const std::int32_t old_size = session.PrintFontSize;
   if (!chosen.name.empty()) session.PrintFontName = chosen.name;
+  // KEPT: a size that is too small is passed over without a word, one that is too large is told; a
+  // repair would tell of both.
   if (chosen.size > kTooSmall) session.PrintFontSize = chosen.size;
   session.PrintFontBold = chosen.bold;
   session.PrintFontItalic = chosen.italic;

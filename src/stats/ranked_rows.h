@@ -20,8 +20,10 @@ std::vector<Row> FromTheLast(std::vector<Row> rows, const std::vector<int>& plac
   return turned;
 }
 
+// KEPT: the sort swaps equal values, so that rows of one value need not stand as they came; a
+// repair would leave them so.
 /// Rows with the highest value first: as the sorting pass leaves them when it swaps equal ones, and
-/// turned round. Two equal rows alone stay as they were, more of them do not.
+/// turned round.
 template <typename Row, typename ValueOf>
 std::vector<Row> HighestFirst(std::vector<Row> rows, ValueOf value_of) {
   std::vector<double> values;
@@ -30,6 +32,8 @@ std::vector<Row> HighestFirst(std::vector<Row> rows, ValueOf value_of) {
   return FromTheLast(std::move(rows), GapSortByValue(values));
 }
 
+// KEPT: names are compared by their letters' codes, so that one in lower case stands behind all in
+// upper case; a repair would fold case.
 /// Rows with names from A to Z by their bytes: as the sorting pass leaves them descending, equal
 /// ones in order, and turned round.
 template <typename Row>

@@ -172,7 +172,7 @@ TEST_F(LadderConfiguration, AnotherNumberOfGamesHoldsForLaterEntriesOnly) {
   EXPECT_TRUE(OnFile(ThreeRounds()));
 }
 
-TEST_F(LadderConfiguration, TeamsInTheFinalsHaveNoOtherEffect) {
+TEST_F(LadderConfiguration, KeptTeamsInTheFinalsHaveNoOtherEffect) {
   OpenLadder();
   const auto before = Cells("grdLad");
   DoAll({"click cmdCF", "type cfgFinals 2", "click cmdSaveConfig", "pick lstTableDates 2"});

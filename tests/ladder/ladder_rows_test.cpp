@@ -384,6 +384,18 @@ TEST(LadderRows, TheTotalsOfALeagueBalance) {
   }
 }
 
+// The first pass, at gap 2, brings Charlie to the top and Alpha below Bravo, and nothing brings
+// Alpha back.
+TEST(LadderRows, KeptTeamsLevelOnBothNeedNotStandByTheirNames) {
+  LadderRows rows(4);
+  rows[0].Team = "Alpha";
+  rows[1].Team = "Bravo";
+  rows[2].Team = "Charlie";
+  rows[2].Points = 1;
+  rows[3].Team = "Delta";
+  EXPECT_EQ(TeamsOf(Sorted(rows)), (Names{"Charlie", "Bravo", "Alpha", "Delta"}));
+}
+
 TEST(LadderRows, EqualTeamsStayWhereThePassesLeaveThem) {
   for (int count = 0; count <= 12; ++count) {
     // Every way of giving each team one of two points and one of two percentages.

@@ -116,7 +116,7 @@ TEST_F(LadderPenalties, PointsBelowSixteenBitsAreAnOverflow) {
   EXPECT_TRUE(OnFile(ThreeRounds()));
 }
 
-TEST_F(LadderPenalties, ATeamWithoutAMatchOnTheDateGetsNoneWithoutAWord) {
+TEST_F(LadderPenalties, KeptATeamWithoutAMatchOnTheDateGetsNoneWithoutAWord) {
   LayGrade(*this, OnePlayerEach({"Alpha", "Bravo", "Charlie", "Delta", "Idle"}), ThreeRounds());
   OpenFor("Idle");
   const auto before = Cells("grdLad");

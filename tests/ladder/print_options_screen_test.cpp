@@ -360,11 +360,17 @@ TEST_F(LadderPrinting, TheSeasonsTitleIsReadForTheClipboard) {
   EXPECT_TRUE(text.starts_with("Marlow Darts\r\nSummer 2005\r\nA Grade    Wednesday"));
 }
 
-TEST_F(LadderPrinting, LeavingDoesNotClearTheClipboard) {
+TEST_F(LadderPrinting, KeptLeavingDoesNotClearTheClipboardWhateverTheBoxSaid) {
   Lay();
   OpenTab();
-  DoAll({"click cmdClipLadder", "click Command1"});
-  EXPECT_EQ(Count("clipboard"), 0);
+  Do("click cmdClipLadder");
+  const Json copied = Do("clipboard")["text"];
+  ASSERT_NE(copied, "");
+  for (const char* way : {"click cmdSC", "click cmdExit"}) {
+    Do(way);
+    EXPECT_EQ(Count("clipboard"), 0) << way;
+  }
+  EXPECT_EQ(Do("clipboard")["text"], copied);
 }
 
 }  // namespace

@@ -137,7 +137,7 @@ TEST_F(LadderRecording, ATextIsReadByTheNumberThatItBeginsWith) {
   EXPECT_EQ(Matches()[1].HomeScore, 0);
 }
 
-TEST_F(LadderRecording, AByeIsADrawOfNothingAgainstNobody) {
+TEST_F(LadderRecording, KeptAByeIsADrawOfNothingAgainstNobody) {
   OpenScores();
   DoAll({"pick lstTeams =Alpha", "type txtHomeScore B", "answer yes", "click cmdRecord"});
   EXPECT_EQ(BoxTexts(), TextList{kDraw});
@@ -159,7 +159,7 @@ TEST_F(LadderRecording, AByeWithAnAwayTeamIsAMatchOfNoneToTheScore) {
   EXPECT_TRUE(OnFile({MatchOn(17, "Alpha", 0, "Bravo", 11)}));
 }
 
-TEST_F(LadderRecording, TheOddTeamCanHaveItsByeOnceThePanelIsFilledAnew) {
+TEST_F(LadderRecording, KeptTheOddTeamCanHaveItsByeOnceThePanelIsFilledAnew) {
   LayGrade(*this, OnePlayerEach({"Alpha", "Bravo", "Charlie"}),
            {MatchOn(10, "Alpha", 6, "Bravo", 5)});
   OpenScores();

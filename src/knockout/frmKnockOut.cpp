@@ -1,6 +1,9 @@
 #include "knockout/frmKnockOut.h"
 
+#include <utility>
+
 #include "data/competition.h"
+#include "data/runtime_error.h"
 #include "data/text.h"
 #include "session/messages.h"
 #include "session/shared_procedures.h"
@@ -137,10 +140,16 @@ void frmKnockOut::cmdSelAll_Click() { TakeGrade(kAllGrades); }
 
 void frmKnockOut::TakeGrade(std::string_view grade) {
   KOGridMT();
-  grade_ = grade;
+  const std::string grade_before = std::exchange(grade_, grade);
   fraKO.Enable();
   fraKOGrade.Hide();
-  GetAssocPlayers();
+  try {
+    GetAssocPlayers();
+  } catch (const RunTimeError&) {
+    grade_ = grade_before;
+    ListNobody();
+    throw;
+  }
   lblGrade.SetCaption(grade_);
 }
 

@@ -126,6 +126,7 @@ struct frmKnockOut : Screen {
   void OpenHelp(int topic);
   void ShowDate();
   void TakeGrade(std::string_view grade);
+  void ListNobody();
   void ButtonsOff();
   [[nodiscard]] int Selected() const;
   [[nodiscard]] int FirstFreePlace() const;

@@ -112,6 +112,15 @@ void frmKnockOut::GetAssocPlayers() {
   UpdateNOP();
 }
 
+/// What a grade that could not be listed leaves: nobody, and that is told, since the draw and the
+/// print go by the numbers on show.
+void frmKnockOut::ListNobody() {
+  lstAllPlayers.Clear();
+  total_available_ = 0;
+  lblKONOP[4].SetCaption("0");
+  UpdateNOP();
+}
+
 void frmKnockOut::UpdateNOP() {
   lblKONOP[0].SetCaption("Players NOT Selected");
   lblKONOP[1].SetCaption(std::to_string(lstAllPlayers.Count()));

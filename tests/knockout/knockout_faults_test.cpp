@@ -111,6 +111,30 @@ TEST(KnockOutFaults, AListingThatFailsCanBeDoneAgain) {
   SweepPowerCuts(Listing());
 }
 
+/// The table is emptied before the players are read, and nothing is drawn, printed or saved by the
+/// numbers that stood there before.
+TEST(KnockOutFaults, AGradeThatCannotBeListedLeavesNobodyAndNoNumberOfTheOneBefore) {
+  for (const char* operation : {"open 1", "read 1", "close 1"}) {
+    Club club(ModelFaceAlone());
+    LeadToSelection(club);
+    club.DoAll({"answer yes", "click cmdKOGrade", "pick cboResGrade =B Grade",
+                std::string("fault ") + operation + " 57", "click cmdGradeOK"});
+    EXPECT_EQ(club.BoxTexts(), (TextList{"DEVICE I/O ERROR    "})) << operation;
+    EXPECT_TRUE(PlayersOf(club).empty()) << operation;
+    EXPECT_TRUE(club.Lines("lstAllPlayers").empty()) << operation;
+    for (const char* number : {"lblKONOP(1)", "lblKONOP(3)", "lblKONOP(4)"}) {
+      EXPECT_EQ(club.Caption(number), "0") << operation << ' ' << number;
+    }
+    EXPECT_EQ(club.Caption("lblGrade"), "All Association Grades") << operation;
+    club.DoAll({"fault off", "click cmdPrnt"});
+    EXPECT_EQ(club.BoxTexts(), (TextList{"Nothing to PRINT!"})) << operation;
+    club.Do("click cmdScramble");
+    club.DoAll({"click cmdKOGrade", "pick cboResGrade =B Grade", "click cmdGradeOK"});
+    EXPECT_EQ(club.Lines("lstAllPlayers"), (TextList{"Dean, Di : B Grade", "Ely, Bo : B Grade"}));
+    EXPECT_EQ(club.Caption("lblGrade"), "B Grade") << operation;
+  }
+}
+
 /// What is told of a failure: the file words for list files, the error box for the rest.
 TEST(KnockOutFaults, FailuresAreToldInTheirWords) {
   Club club(ModelFaceAlone());

@@ -65,6 +65,7 @@ void frmAnnual::GetGrades() {
 void frmAnnual::cboGrades_Click() {
   FileNames();
   GridsOFF();
+  ListNobody();
   GetTeams();
   if (cboTeams.Count() == 0) GetPlayers();
 }
@@ -85,17 +86,27 @@ void frmAnnual::cboTeams_Click() {
   GetPlayers();
 }
 
-void frmAnnual::GetPlayers() {
+/// Where no players can be listed, none of the grade or team before can be picked.
+void frmAnnual::ListNobody() {
   lstPlayers.Clear();
   ids_.clear();
   lblNoneFound.Hide();
+  TellCount();
+}
+
+void frmAnnual::TellCount() {
+  lblHmP.SetCaption("Players (" + std::to_string(lstPlayers.Count()) + ")");
+}
+
+void frmAnnual::GetPlayers() {
+  ListNobody();
   session_.Team = Trim(cboTeams.Text());
   const SeasonResults season(session_, context_.channels);
   for (const auto& player : season.PlayersOf(session_.Grade, session_.Team)) {
     lstPlayers.AddLine(player.line);
     ids_.push_back(player.id);
   }
-  lblHmP.SetCaption("Players (" + std::to_string(lstPlayers.Count()) + ")");
+  TellCount();
   if (lstPlayers.Count() > 0) return;
   lblNoneFound.SetCaption("  No results found for: \r " + session_.Team + ",  " + session_.Grade +
                           ".  ");

@@ -87,6 +87,8 @@ struct frmAnnual : Screen {
  private:
   void WirePicks();
   void WirePrinting();
+  void ListNobody();
+  void TellCount();
   void ShowPicks(bool shown);
   void ShowGrids(bool shown);
   void OfferAll();

@@ -219,6 +219,24 @@ TEST_F(SeasonReport, AnotherTeamHidesTheSeason) {
   EXPECT_EQ(InSession("Grade"), "B Grade");
 }
 
+TEST_F(SeasonReport, AGradeOrTeamThatCannotBeReadLeavesNobodyOfTheOneBefore) {
+  HOLDS_FOR_MODELS_ALONE("the fault lies in one file system");
+  for (const char* pick : {"pick cboGrades =B Grade", "pick cboTeams =Lions"}) {
+    for (int operation = 1; operation <= 6; ++operation) {
+      OpenHill();
+      DoAll({"fault any " + std::to_string(operation) + " 57", pick});
+      EXPECT_EQ(BoxTexts(), TextList{"DEVICE I/O ERROR    "}) << pick << ' ' << operation;
+      EXPECT_TRUE(Lines("lstPlayers").empty()) << pick << ' ' << operation;
+      EXPECT_EQ(Caption("lblHmP"), "Players (0)") << pick << ' ' << operation;
+      EXPECT_FALSE(Shown("lblNoneFound")) << pick << ' ' << operation;
+      EXPECT_FALSE(Shown("grdAnnual")) << pick << ' ' << operation;
+      DoAll({"fault off", pick});
+      EXPECT_TRUE(BoxTexts().empty());
+      DoAll({"click cmdCancelAnn", "click Image10"});
+    }
+  }
+}
+
 TEST_F(SeasonReport, TheClipboardGetsSeasonAndTotals) {
   OpenHill();
   Do("click cmdClipAnnual");

@@ -8,6 +8,10 @@ namespace marlowbeck {
 namespace {
 
 constexpr const char* kPattern = "*.ko4";
+// KEPT: both file boxes write KNOCK-OUT with a zero in their titles; a repair would write the
+// letter.
+constexpr const char* kSaveTitle = "[Marlowbeck] SAVE KNOCK-0UT file.";
+constexpr const char* kOpenTitle = "[Marlowbeck] OPEN KNOCK-0UT file.";
 
 /// The path that a file dialog came back with; empty when it was cancelled or left as it stood.
 std::string AskForFile(const Context& context, FileDialogRequest::Mode mode, const char* title) {
@@ -39,8 +43,7 @@ void frmKnockOut::cmdSaveKO_Click() {
     return;
   }
   WithFileWords([this] {
-    const std::string file_name =
-        AskForFile(context_, FileDialogRequest::Mode::Save, "[Marlowbeck] SAVE KNOCK-0UT file.");
+    const std::string file_name = AskForFile(context_, FileDialogRequest::Mode::Save, kSaveTitle);
     if (!file_name.empty()) SaveList(file_name);
   });
 }
@@ -67,8 +70,7 @@ void frmKnockOut::cmdOpen_Click() {
 }
 
 void frmKnockOut::OpenList() {
-  const std::string file_name =
-      AskForFile(context_, FileDialogRequest::Mode::Open, "[Marlowbeck] OPEN KNOCK-0UT file.");
+  const std::string file_name = AskForFile(context_, FileDialogRequest::Mode::Open, kOpenTitle);
   if (file_name.empty()) return;
   const ListReading reading = ReadList(context_.channels.ReadWhole(file_name));
   grade_ = reading.last_item;

@@ -41,6 +41,15 @@ TEST_F(KnockOutLists, AreSavedByteForByte) {
   EXPECT_EQ(Boxes()[0].text, FilePath("Cup.ko4").string() + " has been saved!");
 }
 
+TEST_F(KnockOutLists, TheTitlesOfBothFileBoxesHaveAZeroForTheLetter) {
+  // KEPT: a repair would write KNOCK-OUT.
+  OpenFive();
+  DoAll({"click cmdALL", "file-cancel", "click cmdSaveKO"});
+  EXPECT_EQ(EventsNamed("file").at(0)["title"], "[Marlowbeck] SAVE KNOCK-0UT file.");
+  DoAll({"file-cancel", "click cmdOpen"});
+  EXPECT_EQ(EventsNamed("file").at(0)["title"], "[Marlowbeck] OPEN KNOCK-0UT file.");
+}
+
 TEST_F(KnockOutLists, AnEmptyOneCannotBeSaved) {
   OpenFive();
   Do("click cmdSaveKO");

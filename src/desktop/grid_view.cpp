@@ -183,7 +183,10 @@ void GridView::ShareOutColumns() {
     names.push_back(col);
   }
   for (const int col : names) MakeRoomForWords(col, names);
-  FitRows(RowHeights::AsNeeded);
+  const bool whole = std::all_of(names.begin(), names.end(), [this](int col) {
+    return WidthOfColumn(col) <= table_.columnWidth(col);
+  });
+  FitRows(whole && !HasLineBreaks() ? RowHeights::Alike : RowHeights::AsNeeded);
 }
 
 /// Takes what a column lacks for its longest word from others that have more than theirs need.

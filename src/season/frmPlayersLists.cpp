@@ -69,7 +69,7 @@ void frmPlayersLists::ListTeams() {
   context_.channels.ForEachRecord(Channel::Players,
                                   [&](Bytes record, int) { teams.Add(PlayerView(record)); });
   context_.channels.CloseAll();
-  for (const std::string& line : teams.Lines()) lstteams.AddLine(line);
+  for (const std::string& line : teams.TakeLines()) lstteams.AddLine(line);
 }
 
 void frmPlayersLists::cmdClip_Click() {

@@ -5,6 +5,7 @@
 #include "data/competition.h"
 #include "data/text.h"
 #include "print/tabbed_text.h"
+#include "season/name_search.h"
 #include "session/messages.h"
 #include "session/shared_procedures.h"
 #include "ui/screens.h"
@@ -63,20 +64,15 @@ void frmSearchPlayer::GetPlayers() {
   OpenFile(session_, context_.channels);
   // Without an open competition there is nobody to be found.
   if (session_.PlayerFile.empty()) return TellCount();
-  context_.channels.ForEachRecord(Channel::Players, [&](Bytes record, int) {
-    if (UpperCase(PlayerView(record).Surname()).find(session_.SearchText) == std::string::npos) {
-      return;
-    }
-    // The fields stand as they are in the record, trailing blanks included.
-    const PlayerRecord player = DecodePlayer(record);
-    const int row = ++session_.RowCount;
-    grdShow.SetSize(row + 1, kColumns);
-    grdShow.SetCell(row, 0, player.Surname);
-    grdShow.SetCell(row, 1, player.FirstName);
-    grdShow.SetCell(row, 2, player.Team);
-    grdShow.SetCell(row, 3, player.Grade);
-  });
+  NameSearch search(session_.SearchText);
+  context_.channels.ForEachRecord(Channel::Players, [&](Bytes record, int) { search.Add(record); });
   context_.channels.CloseAll();
+  session_.RowCount = search.Count();
+  grdShow.SetSize(session_.RowCount + 1, kColumns);
+  for (int row = 1; row <= search.Count(); ++row) {
+    int column = 0;
+    for (const auto cell : search.Row(row - 1)) grdShow.SetCell(row, column++, cell);
+  }
   TellCount();
 }
 

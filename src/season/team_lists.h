@@ -1,5 +1,7 @@
 #pragma once
 
+#include <cstddef>
+#include <functional>
 #include <string>
 #include <string_view>
 #include <unordered_map>
@@ -16,16 +18,27 @@ class TeamLists {
   /// `grade` is trimmed.
   explicit TeamLists(std::string_view grade) : grade_(grade) {}
 
+  /// Throws SubscriptOutOfRange for more players of the grade than a list has places.
   void Add(const PlayerView& player);
 
   /// For each team in ascending order its name, a rule, its players in file order and an empty
-  /// line. Throws SubscriptOutOfRange for more players than a list has places.
-  [[nodiscard]] std::vector<std::string> Lines() const;
+  /// line. Leaves nobody behind.
+  [[nodiscard]] std::vector<std::string> TakeLines();
 
  private:
+  struct Hash {
+    using is_transparent = void;
+    std::size_t operator()(std::string_view team) const {
+      return std::hash<std::string_view>()(team);
+    }
+  };
+
   std::string grade_;
-  std::vector<std::string> teams_;  ///< of each player
-  std::unordered_map<std::string, std::vector<std::string>> players_;
+  std::vector<std::string> names_;    ///< of the players of the grade
+  std::vector<std::size_t> team_of_;  ///< each player's, a place in the two below
+  std::vector<std::string> teams_;
+  std::vector<std::size_t> counts_;  ///< of each team's players
+  std::unordered_map<std::string, std::size_t, Hash, std::equal_to<>> places_;
 };
 
 }  // namespace marlowbeck

@@ -16,7 +16,7 @@ std::vector<std::string> LinesOf(const std::vector<PlayerRecord>& players, std::
     const PlayerBytes bytes = Encode(player);
     lists.Add(PlayerView(bytes));
   }
-  return lists.Lines();
+  return lists.TakeLines();
 }
 
 /// The same by a loop over all players for each team.

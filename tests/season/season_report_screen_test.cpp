@@ -194,6 +194,24 @@ TEST_F(SeasonReport, TheWorkFileIsTheLastPlayers) {
                                    "500,40,100,0,1,0,0,0,0,0\r\n");
 }
 
+TEST_F(SeasonReport, QuotesAndCommasInNamesAndOppositionsComeThrough) {
+  Lay();
+  WritePlayers("Winter.qza", {Player(11, "O\"Dea, B", "Al \"Arm\"", "Hawks", "A Grade"),
+                              Player(21, "Ames", "Al", "Lions", "A Grade")});
+  const std::string opposition = "The \"Cubs\", 2";
+  WriteResults(kAResults, {Figures(Night(11, "Hawks", opposition, 31), 500, 40)});
+  DoAll({"click imgPrinter", "click Image7", "pick lstPlayers 0"});
+  EXPECT_EQ(Lines("lstPlayers"), TextList{"O\"Dea, B,  Al \"Arm\""});
+  EXPECT_EQ(Caption("lblPlayer"), "Season Report:   Al \"Arm\" O\"Dea, B");
+  EXPECT_EQ(Row("grdAnnual", 1),
+            (TextList{"31/03/2004", opposition, "500", "40", "", "1", "100", "", "", "", "12.50"}));
+  EXPECT_EQ(Totals()[1], "500");
+  EXPECT_EQ(File(kReportFile), "\"Al \"Arm\" O\"Dea, B\"\r\n#2004-03-31#,1,\"" + opposition +
+                                   std::string(30 - opposition.size(), ' ') +
+                                   "\"\r\n500,40,100,0,1\r\n0,0,0,0,0,0\r\n"
+                                   "500,40,100,0,1,0,0,0,0,0\r\n");
+}
+
 TEST_F(SeasonReport, AMissingTitleIsAskedForOnce) {
   Lay();
   DeleteFile("Winter_A Grade.qzs");

@@ -72,7 +72,7 @@ void frmPegRatio::ReCalc() {
   fraGrid.Hide();
   // What is not worked out to its end is neither printed nor copied.
   OfferCopies(false);
-  rows_.clear();
+  ForgetRows();
   session_.Grade = Trim(cboResGrade.Text());
   NameGradeFiles(session_);
   if (!AnyPegs()) {
@@ -83,7 +83,7 @@ void frmPegRatio::ReCalc() {
   try {
     CalcRatio();
   } catch (const RunTimeError&) {
-    rows_.clear();
+    ForgetRows();
     pbRatio.Hide();
     throw;
   }
@@ -92,7 +92,16 @@ void frmPegRatio::ReCalc() {
   lblHi1.SetCaption(session_.SeasonDescription);
   OfferCopies(true);
   fraGrid.Show();
-  // An open panel still has the amount of the list before.
+  TellOpenPanel();
+}
+
+void frmPegRatio::ForgetRows() {
+  rows_.clear();
+  TellOpenPanel();
+}
+
+/// An open panel still has the amount of the list before.
+void frmPegRatio::TellOpenPanel() {
   if (picPrinter.Visible()) OfferAmount();
 }
 

@@ -84,6 +84,8 @@ struct frmPegRatio : Screen {
   void WriteRows();
   void OfferCopies(bool offered);
   void OfferAmount();
+  void ForgetRows();
+  void TellOpenPanel();
 
   const Context& context_;
   Session& session_;

@@ -208,6 +208,17 @@ TEST_F(PegRatioScreen, AnOpenPanelTakesTheAmountOfAnotherGradesList) {
   EXPECT_EQ(pages[0].boxes.size(), 4U);
 }
 
+TEST_F(PegRatioScreen, AnOpenPanelOffersNothingOfAGradeWithoutPegs) {
+  OpenPrinting();
+  EXPECT_EQ(Text("txtHI"), "3");
+  Do("pick cboResGrade =B Grade");
+  EXPECT_EQ(BoxTexts(), (TextList{"No pegs found for B Grade.   "}));
+  EXPECT_EQ(Caption("optHI(0)"), "Print Entire List of 0 Peg Ratios");
+  EXPECT_EQ(Text("txtHI"), "0");
+  Do("click cmdPrintRatios");
+  EXPECT_EQ(BoxTexts(), (TextList{"You must show AMOUNT to print!    "}));
+}
+
 TEST_F(PegRatioScreen, AListThatCannotBeWrittenIsNotOffered) {
   OpenList();
   Do("fault write 1 61");

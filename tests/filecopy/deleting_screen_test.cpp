@@ -201,12 +201,15 @@ TEST_F(CopierFolders, ThatAreNewLeaveTheOtherPanesSelection) {
 }
 
 TEST_F(CopierFolders, AreMadeByNamesBeyondTheCodePageAndOpened) {
-  Open();
-  DoAll({"input \u0141\u00F3d\u017A", "click cmdNewS"});
-  EXPECT_TRUE(HasFile("\u0141\u00F3d\u017A"));
-  Do("dblpick BuDirS =\u0141\u00F3d\u017A");
-  EXPECT_EQ(Get("BuDirS")["path"], PathOf("\u0141\u00F3d\u017A"));
-  EXPECT_EQ(Caption("lblPathS"), PathOf("\u0141\u00F3d\u017A"));
+  for (const std::string name : {"\u0141\u00F3d\u017A", "\U0001F3AF 180"}) {
+    Open();
+    DoAll({"input " + name, "click cmdNewS"});
+    EXPECT_TRUE(HasFile(name)) << name;
+    Do("dblpick BuDirS =" + name);
+    EXPECT_EQ(Get("BuDirS")["path"], PathOf(name));
+    EXPECT_EQ(Caption("lblPathS"), PathOf(name));
+    Do("click cmdCancel");
+  }
 }
 
 TEST_F(CopierFolders, WithoutANameAreNotMade) {

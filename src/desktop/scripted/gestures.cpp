@@ -92,7 +92,11 @@ void PressKey(QWidget& widget, int key, Qt::KeyboardModifiers modifiers, const Q
 void TypeOver(QWidget& entry, const QString& text) {
   PressKey(entry, Qt::Key_A, Qt::ControlModifier);
   if (text.isEmpty()) PressKey(entry, Qt::Key_Delete);
-  for (const QChar letter : text) PressKey(entry, 0, Qt::NoModifier, letter);
+  for (qsizetype at = 0; at < text.size();) {  // a letter may take two characters
+    const qsizetype length = text[at].isHighSurrogate() && at + 1 < text.size() ? 2 : 1;
+    PressKey(entry, 0, Qt::NoModifier, text.sliced(at, length));
+    at += length;
+  }
 }
 
 void SettleEvents() {

@@ -1,6 +1,7 @@
 // Every screen in every state that the scripts of tools/ bring it into, in the smallest window that
 // the program is made for and in a larger one.
 
+#include <cstdlib>
 #include <filesystem>
 #include <fstream>
 
@@ -127,6 +128,16 @@ TEST_F(PanelsOfTheScoreSheets, StandBesideThatOfAnotherOpposition) {
     EXPECT_EQ(Faults(), QString()) << line;
   }
   EXPECT_TRUE(club_.Shown("fraReDoOpp") && club_.Shown("fraTeams"));
+}
+
+TEST_F(PanelsOfTheScoreSheets, StandInTheMiddleWhereNothingStandsBesideThem) {
+  club_.DoAll({"click cmdLeaveResults", "click imgSheets"});
+  EXPECT_EQ(Faults(), QString());
+  const QWidget& window = *WindowOf("frmResults");
+  const QWidget& card = club_.Find("fraChangeGrade");
+  const int left = card.mapTo(&window, QPoint(0, 0)).x();
+  const int right = window.width() - left - card.width();
+  EXPECT_LE(std::abs(left - right), 1);
 }
 
 TEST_F(PanelsOfTheScoreSheets, FitIntoTheSmallestWindowWhereGradeAndDateIsChosenAgain) {

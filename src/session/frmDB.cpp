@@ -146,7 +146,8 @@ void frmDB::Icons() {
   const int count = open ? int{session_.PlayerCount} : 0;
   imgPlayers.SetEnabled(open);
   for (Picture* picture : {&imgSheets, &imgLadder, &imgPrinter}) picture->SetEnabled(count > 0);
-  // With exactly one player the knock-out stays as it was.
+  // KEPT: with exactly one player the knock-out stays as it was, so that one that was lit before a
+  // deletion stays lit; a repair would put it out.
   if (count != 1) imgKO.SetEnabled(count > 1);
   imgbackup.Enable();
   if (!open) {

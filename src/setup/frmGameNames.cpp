@@ -71,6 +71,8 @@ void frmGameNames::cmdSave_Click() {
   context_.channels.CloseAll();
   std::array<std::string, 6> names;
   std::ranges::transform(boxes_, names.begin(), [](const TextBox* box) { return box->Text(); });
+  // KEPT: a name with a comma comes back as two, and those behind it are shifted; a repair would
+  // refuse the comma.
   WriteGameNames(context_, names);
   OKSound(context_);
   GameNames(context_);

@@ -3,13 +3,12 @@
 #include <stdexcept>
 #include <utility>
 
-#include <QBoxLayout>
-#include <QLayout>
 #include <QPushButton>
 #include <QScreen>
 
 #include "desktop/encoding.h"
 #include "desktop/form_catalogue.h"
+#include "desktop/panel_places.h"
 #include "desktop/theme.h"
 
 namespace marlowbeck {
@@ -20,45 +19,6 @@ std::unique_ptr<QWidget> MakeForm(const std::string& screen) {
   if (form == Forms().end()) throw std::logic_error("there is no form for " + screen);
   return form->second();
 }
-
-/// A property of a form's row: a side of it on which nothing stands leaves its room to the others.
-constexpr const char* kSides = "sides";
-
-void ShareOutSides(const QWidget& window) {
-  for (QHBoxLayout* const row : window.findChildren<QHBoxLayout*>()) {
-    if (!row->property(kSides).toBool()) continue;
-    for (int i = 0; i < row->count(); ++i) {
-      QLayout* const side = row->itemAt(i)->layout();
-      row->setStretch(i, side != nullptr && !side->isEmpty() ? 1 : 0);
-    }
-  }
-}
-
-/// What goes and what comes change places in one step: a window that had to hold both for a moment
-/// would stay as large as that.
-class OneStep {
- public:
-  explicit OneStep(QWidget& window) : window_(window), layout_(window.layout()) {
-    if (layout_ != nullptr) layout_->setEnabled(false);
-  }
-  ~OneStep() {
-    if (layout_ == nullptr) return;
-    ShareOutSides(window_);
-    // What lies within first, or the window would reckon with the room that it had.
-    const QList<QWidget*> inner = window_.findChildren<QWidget*>();
-    for (auto widget = inner.rbegin(); widget != inner.rend(); ++widget) {
-      if (QLayout* const layout = (*widget)->layout()) layout->activate();
-    }
-    layout_->setEnabled(true);
-    layout_->activate();
-  }
-  OneStep(const OneStep&) = delete;
-  OneStep& operator=(const OneStep&) = delete;
-
- private:
-  QWidget& window_;
-  QLayout* layout_;
-};
 
 }  // namespace
 
